@@ -18,6 +18,8 @@ std::string_view StandardDescription(int32_t number) {
       return "File not found";
     case kPathFileAccessError:
       return "Path/File access error";
+    case kBadFileFormat:
+      return "Invalid file format";
     case kObjectNotSet:
       return "Object variable or With block variable not set";
     case kObjectRequired:

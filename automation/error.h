@@ -19,6 +19,7 @@ enum ErrorNumber : int32_t {
   kTypeMismatch = 13,
   kFileNotFound = 53,
   kPathFileAccessError = 75,
+  kBadFileFormat = 321,
   kObjectNotSet = 91,
   kObjectRequired = 424,
   kCannotCreateObject = 429,
