@@ -14,6 +14,8 @@ std::string_view StandardDescription(int32_t number) {
       return "Subscript out of range";
     case kTypeMismatch:
       return "Type mismatch";
+    case kErrorLoadingDll:
+      return "Error in loading DLL";
     case kFileNotFound:
       return "File not found";
     case kPathFileAccessError:
@@ -22,6 +24,8 @@ std::string_view StandardDescription(int32_t number) {
       return "Invalid file format";
     case kObjectNotSet:
       return "Object variable or With block variable not set";
+    case kInvalidUseOfNull:
+      return "Invalid use of Null";
     case kObjectRequired:
       return "Object required";
     case kCannotCreateObject:
