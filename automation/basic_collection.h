@@ -3,8 +3,9 @@
 // before or after an item, look-up and removal by position or key.
 //
 // Errors are VB's: a key already present is 457, a missing key is 5, a
-// position outside 1..Count is 9. Look-up by key is a hash look-up; removal
-// and insertion in the middle shift the items after it.
+// position outside 1..Count is 9. Look-up, adding and removal by key take
+// constant time; a look-up by position after removals, and insertion before or
+// after an item, close up the items once in linear time.
 #ifndef KELQLN_AUTOMATION_BASIC_COLLECTION_H_
 #define KELQLN_AUTOMATION_BASIC_COLLECTION_H_
 
@@ -29,42 +30,49 @@ class BasicCollection {
   struct Node {
     T item;
     std::optional<std::string> key;
+    size_t slot;  // where the node stands in slots_
   };
-  using Nodes = std::vector<std::unique_ptr<Node>>;
+  // Removal by key leaves an empty slot behind instead of shifting the items
+  // after it; the slots are closed up the next time a position is needed.
+  using Slots = std::vector<std::unique_ptr<Node>>;
 
  public:
-  template <class NodeIterator, class Value>
+  template <class SlotIterator, class Value>
   class Iterator {
    public:
-    using iterator_category = std::random_access_iterator_tag;
+    using iterator_category = std::forward_iterator_tag;
     using value_type = std::remove_const_t<Value>;
     using difference_type = std::ptrdiff_t;
     using pointer = Value*;
     using reference = Value&;
 
     Iterator() = default;
-    explicit Iterator(NodeIterator at) : at_(at) {}
+    Iterator(SlotIterator at, SlotIterator end) : at_(at), end_(end) {
+      SkipEmpty();
+    }
     reference operator*() const { return (*at_)->item; }
     pointer operator->() const { return &(*at_)->item; }
     Iterator& operator++() {
       ++at_;
+      SkipEmpty();
       return *this;
     }
-    Iterator operator++(int) { return Iterator(at_++); }
-    Iterator& operator--() {
-      --at_;
-      return *this;
-    }
-    difference_type operator-(const Iterator& other) const {
-      return at_ - other.at_;
+    Iterator operator++(int) {
+      Iterator before = *this;
+      ++*this;
+      return before;
     }
     bool operator==(const Iterator& other) const { return at_ == other.at_; }
 
    private:
-    NodeIterator at_{};
+    void SkipEmpty() {
+      while (at_ != end_ && *at_ == nullptr) ++at_;
+    }
+    SlotIterator at_{};
+    SlotIterator end_{};
   };
-  using iterator = Iterator<typename Nodes::iterator, T>;
-  using const_iterator = Iterator<typename Nodes::const_iterator, const T>;
+  using iterator = Iterator<typename Slots::iterator, T>;
+  using const_iterator = Iterator<typename Slots::const_iterator, const T>;
 
   BasicCollection() = default;
   BasicCollection(const BasicCollection& other) { CopyFrom(other); }
@@ -78,12 +86,12 @@ class BasicCollection {
   BasicCollection(BasicCollection&&) noexcept = default;
   BasicCollection& operator=(BasicCollection&&) noexcept = default;
 
-  int32_t Count() const { return static_cast<int32_t>(nodes_.size()); }
-  bool Empty() const { return nodes_.empty(); }
+  int32_t Count() const { return static_cast<int32_t>(live_); }
+  bool Empty() const { return live_ == 0; }
 
-  void Add(T item) { Insert(nodes_.size(), std::move(item), std::nullopt); }
+  void Add(T item) { Insert(live_, std::move(item), std::nullopt); }
   void Add(T item, std::string key) {
-    Insert(nodes_.size(), std::move(item), std::move(key));
+    Insert(live_, std::move(item), std::move(key));
   }
   // VB's Add(item, [key], [before], [after]); giving both `before` and
   // `after` is an invalid call (5).
@@ -91,17 +99,15 @@ class BasicCollection {
            const std::optional<CollectionIndex>& before,
            const std::optional<CollectionIndex>& after = std::nullopt) {
     if (before && after) throw Error(kInvalidProcedureCall);
-    size_t at = nodes_.size();
+    size_t at = live_;
     if (before) at = PositionOf(*before);
     if (after) at = PositionOf(*after) + 1;
     Insert(at, std::move(item), std::move(key));
   }
 
-  T& Item(const CollectionIndex& index) {
-    return nodes_[PositionOf(index)]->item;
-  }
+  T& Item(const CollectionIndex& index) { return NodeOf(index).item; }
   const T& Item(const CollectionIndex& index) const {
-    return nodes_[PositionOf(index)]->item;
+    return NodeOf(index).item;
   }
 
   // The item under `key`, or nullptr: look-up without raising an error.
@@ -117,60 +123,96 @@ class BasicCollection {
 
   // The key of the item at `position` (1-based), if it has one.
   const std::optional<std::string>& KeyAt(int32_t position) const {
-    return nodes_[PositionOf(CollectionIndex(position))]->key;
+    return NodeOf(CollectionIndex(position)).key;
   }
 
   void Remove(const CollectionIndex& index) {
-    size_t at = PositionOf(index);
-    if (nodes_[at]->key) keys_.erase(std::string_view(*nodes_[at]->key));
-    nodes_.erase(nodes_.begin() + static_cast<std::ptrdiff_t>(at));
+    Node& node = NodeOf(index);
+    if (node.key) keys_.erase(std::string_view(*node.key));
+    size_t slot = node.slot;
+    slots_[slot].reset();
+    --live_;
+    while (!slots_.empty() && slots_.back() == nullptr) slots_.pop_back();
   }
 
   void Clear() {
     keys_.clear();
-    nodes_.clear();
+    slots_.clear();
+    live_ = 0;
   }
 
-  iterator begin() { return iterator(nodes_.begin()); }
-  iterator end() { return iterator(nodes_.end()); }
-  const_iterator begin() const { return const_iterator(nodes_.begin()); }
-  const_iterator end() const { return const_iterator(nodes_.end()); }
+  iterator begin() { return iterator(slots_.begin(), slots_.end()); }
+  iterator end() { return iterator(slots_.end(), slots_.end()); }
+  const_iterator begin() const {
+    return const_iterator(slots_.begin(), slots_.end());
+  }
+  const_iterator end() const {
+    return const_iterator(slots_.end(), slots_.end());
+  }
 
  private:
   void CopyFrom(const BasicCollection& other) {
-    nodes_.reserve(other.nodes_.size());
-    for (const auto& node : other.nodes_) {
-      Insert(nodes_.size(), node->item, node->key);
+    slots_.reserve(other.live_);
+    for (const auto& node : other.slots_) {
+      if (node) Insert(live_, node->item, node->key);
     }
+  }
+
+  // Closes the gaps that removals by key left.
+  void Compact() const {
+    if (slots_.size() == live_) return;
+    size_t to = 0;
+    for (size_t from = 0; from < slots_.size(); ++from) {
+      if (slots_[from] == nullptr) continue;
+      slots_[to] = std::move(slots_[from]);
+      slots_[to]->slot = to;
+      ++to;
+    }
+    slots_.resize(to);
   }
 
   void Insert(size_t at, T item, std::optional<std::string> key) {
     if (key && keys_.count(std::string_view(*key))) throw Error(kDuplicateKey);
-    auto node = std::make_unique<Node>(Node{std::move(item), std::move(key)});
+    auto node =
+        std::make_unique<Node>(Node{std::move(item), std::move(key), 0});
     Node* raw = node.get();
-    nodes_.insert(nodes_.begin() + static_cast<std::ptrdiff_t>(at),
-                  std::move(node));
+    if (at == live_) {
+      raw->slot = slots_.size();
+      slots_.push_back(std::move(node));
+    } else {
+      Compact();
+      slots_.insert(slots_.begin() + static_cast<std::ptrdiff_t>(at),
+                    std::move(node));
+      for (size_t i = at; i < slots_.size(); ++i) slots_[i]->slot = i;
+    }
+    ++live_;
     // The map's key views the node's own copy, which never moves.
     if (raw->key) keys_.emplace(std::string_view(*raw->key), raw);
   }
 
-  size_t PositionOf(const CollectionIndex& index) const {
-    if (!index.IsKey()) {
-      int32_t position = index.Position();
-      if (position < 1 || position > Count()) {
-        throw Error(kSubscriptOutOfRange);
-      }
-      return static_cast<size_t>(position - 1);
+  Node& NodeOf(const CollectionIndex& index) const {
+    if (index.IsKey()) {
+      auto found = keys_.find(std::string_view(index.Key()));
+      if (found == keys_.end()) throw Error(kInvalidProcedureCall);
+      return *found->second;
     }
-    auto found = keys_.find(std::string_view(index.Key()));
-    if (found == keys_.end()) throw Error(kInvalidProcedureCall);
-    for (size_t i = 0; i < nodes_.size(); ++i) {
-      if (nodes_[i].get() == found->second) return i;
-    }
-    throw Error(kInvalidProcedureCall);
+    return *slots_[PositionOf(index)];
   }
 
-  Nodes nodes_;
+  // The 0-based position of an item in insertion order.
+  size_t PositionOf(const CollectionIndex& index) const {
+    if (index.IsKey()) {
+      Compact();
+      return NodeOf(index).slot;
+    }
+    int32_t position = index.Position();
+    if (position < 1 || position > Count()) throw Error(kSubscriptOutOfRange);
+    Compact();
+    return static_cast<size_t>(position - 1);
+  }
+
+  mutable Slots slots_;
+  size_t live_ = 0;
   std::unordered_map<std::string_view, Node*, KeyHash, KeyEqual> keys_;
 };
 
