@@ -51,6 +51,13 @@ class AddInTest : public ::testing::Test {
 
 const std::string kKey = kAddInsKey;
 
+std::shared_ptr<AddIn> NewAddIn(std::string name, std::string prog_id = "") {
+  AddInDescription description;
+  description.name = std::move(name);
+  description.server_prog_id = std::move(prog_id);
+  return std::make_shared<AddIn>(std::move(description));
+}
+
 TEST_F(AddInTest, TheRegistryDescribesTheAddIns) {
   platform::RegistryStore store;
   auto hklm = platform::kHkeyLocalMachine;
@@ -110,26 +117,23 @@ TEST_F(AddInTest, TheServerIsMadeOnceByItsProgId) {
     ++made;
     return automation::Object(automation::Collection::Create());
   });
-  auto add_in = std::make_shared<AddIn>(
-      AddInDescription{.name = "C++", .server_prog_id = "kelqln.TestServer"});
+  auto add_in = NewAddIn("C++", "kelqln.TestServer");
   Object first = automation::GetObject(add_in, orel::add_in::kServer);
   EXPECT_NE(first, nullptr);
   EXPECT_EQ(automation::GetObject(add_in, orel::add_in::kServer), first);
   EXPECT_EQ(made, 1);
   automation::UnregisterClass("kelqln.TestServer");
 
-  auto unknown = std::make_shared<AddIn>(
-      AddInDescription{.name = "X", .server_prog_id = "kelqln.NoSuchServer"});
+  auto unknown = NewAddIn("X", "kelqln.NoSuchServer");
   EXPECT_EQ(ErrorOf([&] { automation::Get(unknown, orel::add_in::kServer); }),
             automation::kCannotCreateObject);
-  auto none = std::make_shared<AddIn>(AddInDescription{.name = "Y"});
+  auto none = NewAddIn("Y");
   EXPECT_EQ(ErrorOf([&] { automation::Get(none, orel::add_in::kServer); }),
             automation::kCannotCreateObject);
 }
 
 TEST_F(AddInTest, SettingsAreWrittenAndReadBack) {
-  auto add_in =
-      std::make_shared<AddIn>(AddInDescription{.name = "VisualStudio"});
+  auto add_in = NewAddIn("VisualStudio");
   add_in->SetSettingsStore(std::make_shared<SettingsStore>(SettingsPath()));
   Object object = add_in;
   namespace a = orel::add_in;
@@ -146,7 +150,7 @@ TEST_F(AddInTest, SettingsAreWrittenAndReadBack) {
   EXPECT_EQ(again.Read("Other", "Width", "none"), "none");
 
   // An add-in without a store has no settings members.
-  auto plain = std::make_shared<AddIn>(AddInDescription{.name = "C++"});
+  auto plain = NewAddIn("C++");
   EXPECT_EQ(ErrorOf([&] {
               automation::CallByName(plain, a::kReadSetting, "S", "K", "D");
             }),
@@ -196,12 +200,9 @@ TEST_F(AddInTest, TheProjectsRegistryFileInstallsTheSettingsAddIn) {
 
 TEST_F(AddInTest, AddInNamesAreUnique) {
   AddInManager manager;
-  manager.Add(std::make_shared<AddIn>(AddInDescription{.name = "VB"}));
-  EXPECT_EQ(
-      ErrorOf([&] {
-        manager.Add(std::make_shared<AddIn>(AddInDescription{.name = "VB"}));
-      }),
-      automation::kDuplicateKey);
+  manager.Add(NewAddIn("VB"));
+  EXPECT_EQ(ErrorOf([&] { manager.Add(NewAddIn("VB")); }),
+            automation::kDuplicateKey);
   EXPECT_NE(manager.Find("VB"), nullptr);
   EXPECT_EQ(manager.Find("vb"), nullptr);
 }
