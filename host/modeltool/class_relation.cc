@@ -3,7 +3,9 @@
 #include <algorithm>
 #include <utility>
 
+#include "automation/error.h"
 #include "host/modeltool/class.h"
+#include "host/modeltool/model.h"
 
 namespace host::modeltool {
 
@@ -14,6 +16,11 @@ std::string ClassRelation::SupplierName() const {
 
 void ClassRelation::SetSupplier(const std::shared_ptr<Class>& supplier,
                                 std::string supplier_name) {
+  if (supplier && supplier->GetModel() != RequireModel()) {
+    throw automation::Error(
+        automation::kInvalidProcedureCall,
+        "A relation's supplier is a class of the same model");
+  }
   if (auto before = Supplier()) {
     std::erase_if(before->supplier_of_, [this](const auto& weak) {
       return weak.expired() || weak.lock().get() == this;

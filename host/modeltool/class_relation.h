@@ -23,7 +23,8 @@ class ClassRelation : public Element {
   // The supplier's name: the supplier class's when there is one.
   std::string SupplierName() const;
   // Points the relation at a class of the same model, or (nullptr) at a
-  // class outside it called `supplier_name`.
+  // class outside it called `supplier_name`. kInvalidProcedureCall for a
+  // class of another model; kObjectNotSet once the relation is deleted.
   void SetSupplier(const std::shared_ptr<Class>& supplier,
                    std::string supplier_name = "");
 

@@ -1,5 +1,6 @@
 #include "host/modeltool/model_reader.h"
 
+#include <algorithm>
 #include <initializer_list>
 #include <nlohmann/json.hpp>
 #include <set>

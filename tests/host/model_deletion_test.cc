@@ -168,6 +168,11 @@ TEST(ModelDeletionTest, ADeletedElementIsCutLoose) {
   // Making members of a deleted class is refused, not half done.
   EXPECT_EQ(ErrorOf([&] { shape->NewAttribute("z"); }),
             automation::kObjectNotSet);
+  // Nor can a live element be pointed at it.
+  EXPECT_EQ(ErrorOf([&] { s.circle_draws->SetSupplier(shape); }),
+            automation::kInvalidProcedureCall);
+  EXPECT_EQ(ErrorOf([&] { s.model->NewAssociation(s.canvas, shape); }),
+            automation::kInvalidProcedureCall);
   EXPECT_EQ(ErrorOf([&] {
               automation::CallByName(shape, orel::element::kSetUniqueId, "X");
             }),
