@@ -88,19 +88,28 @@ class ModelReader::Parser {
 
     const Json* components = Field(file, f::kComponentView);
     if (!components) Fail(top, "\"componentView\" is missing");
+    RequireObject(*components, f::kComponentView);
     auto component_root = std::make_shared<ComponentPackage>(
         Text(*components, f::kName, f::kComponentView, false));
     Register(*component_root, *components, f::kComponentView);
     model_->root_component_package_ = component_root;
-    ReadComponentPackage(*components, f::kComponentView, *component_root);
+    ReadPackage(*components, f::kComponentView, *component_root, f::kComponents,
+                [this](const Json& item, const std::string& at,
+                       ComponentPackage& package) {
+                  ReadComponent(item, at, package);
+                });
 
     const Json* classes = Field(file, f::kLogicalView);
     if (!classes) Fail(top, "\"logicalView\" is missing");
+    RequireObject(*classes, f::kLogicalView);
     auto class_root = std::make_shared<LogicalPackage>(
         Text(*classes, f::kName, f::kLogicalView, false));
     Register(*class_root, *classes, f::kLogicalView);
     model_->root_logical_package_ = class_root;
-    ReadLogicalPackage(*classes, f::kLogicalView, *class_root);
+    ReadPackage(
+        *classes, f::kLogicalView, *class_root, f::kClasses,
+        [this](const Json& item, const std::string& at,
+               LogicalPackage& package) { ReadClassOf(item, at, package); });
 
     ResolveAssignments();
     ResolveRelations();
@@ -141,11 +150,15 @@ class ModelReader::Parser {
 
   // Refuses anything but an object with the given fields: a misspelt field
   // would otherwise be lost without a word.
-  void Fields(const Json& value, const std::string& where,
-              std::initializer_list<const char*> allowed) {
+  void RequireObject(const Json& value, const std::string& where) {
     if (!value.is_object()) {
       Fail(where, std::string("expected an object, found ") + TypeOf(value));
     }
+  }
+
+  void Fields(const Json& value, const std::string& where,
+              std::initializer_list<const char*> allowed) {
+    RequireObject(value, where);
     for (const auto& [key, item] : value.items()) {
       bool known = false;
       for (const char* name : allowed) known = known || key == name;
@@ -254,64 +267,55 @@ class ModelReader::Parser {
     }
   }
 
-  void ReadComponentPackage(const Json& object, const std::string& where,
-                            ComponentPackage& package) {
+  // What both kinds of package hold: the common fields, the modifiable
+  // flag, their items (components or classes, read by `read_item`) and the
+  // packages inside, which hold the same.
+  template <class Package, class ReadItem>
+  void ReadPackage(const Json& object, const std::string& where,
+                   Package& package, const char* items, ReadItem read_item) {
     Fields(object, where,
            {f::kId, f::kName, f::kStereotype, f::kToolProperties,
-            f::kModifiable, f::kComponents, f::kPackages});
+            f::kModifiable, items, f::kPackages});
     ReadCommon(object, where, package);
     package.SetModifiable(Bool(object, f::kModifiable, where, true));
-    const Json& components = Array(object, f::kComponents, where);
-    for (size_t i = 0; i < components.size(); ++i) {
-      std::string at = At(At(where, f::kComponents), i);
-      const Json& item = components[i];
-      Fields(item, at,
-             {f::kId, f::kName, f::kStereotype, f::kToolProperties,
-              f::kLanguage, f::kClasses, f::kDependencies});
-      auto component = package.NewComponent(Text(item, f::kName, at, false),
-                                            NewId(item, at));
-      ReadCommon(item, at, *component);
-      component->SetLanguage(Text(item, f::kLanguage, at, false));
-      component_classes_.push_back({component, Ids(item, f::kClasses, at), at});
-      const Json& dependencies = Array(item, f::kDependencies, at);
-      for (size_t d = 0; d < dependencies.size(); ++d) {
-        dependencies_.push_back(
-            {component, &dependencies[d], At(At(at, f::kDependencies), d)});
-      }
+    const Json& list = Array(object, items, where);
+    for (size_t i = 0; i < list.size(); ++i) {
+      std::string at = At(At(where, items), i);
+      RequireObject(list[i], at);
+      read_item(list[i], at, package);
     }
     const Json& packages = Array(object, f::kPackages, where);
     for (size_t i = 0; i < packages.size(); ++i) {
       std::string at = At(At(where, f::kPackages), i);
-      if (!packages[i].is_object()) Fields(packages[i], at, {});
+      RequireObject(packages[i], at);
       auto inner = package.NewPackage(Text(packages[i], f::kName, at, false),
                                       NewId(packages[i], at));
-      ReadComponentPackage(packages[i], at, *inner);
+      ReadPackage(packages[i], at, *inner, items, read_item);
     }
   }
 
-  void ReadLogicalPackage(const Json& object, const std::string& where,
-                          LogicalPackage& package) {
-    Fields(object, where,
-           {f::kId, f::kName, f::kStereotype, f::kToolProperties,
-            f::kModifiable, f::kClasses, f::kPackages});
-    ReadCommon(object, where, package);
-    package.SetModifiable(Bool(object, f::kModifiable, where, true));
-    const Json& classes = Array(object, f::kClasses, where);
-    for (size_t i = 0; i < classes.size(); ++i) {
-      std::string at = At(At(where, f::kClasses), i);
-      if (!classes[i].is_object()) Fields(classes[i], at, {});
-      auto cls = package.NewClass(Text(classes[i], f::kName, at, false),
-                                  NewId(classes[i], at));
-      ReadClass(classes[i], at, *cls);
+  void ReadComponent(const Json& item, const std::string& at,
+                     ComponentPackage& package) {
+    Fields(item, at,
+           {f::kId, f::kName, f::kStereotype, f::kToolProperties, f::kLanguage,
+            f::kClasses, f::kDependencies});
+    auto component =
+        package.NewComponent(Text(item, f::kName, at, false), NewId(item, at));
+    ReadCommon(item, at, *component);
+    component->SetLanguage(Text(item, f::kLanguage, at, false));
+    component_classes_.push_back({component, Ids(item, f::kClasses, at), at});
+    const Json& dependencies = Array(item, f::kDependencies, at);
+    for (size_t d = 0; d < dependencies.size(); ++d) {
+      dependencies_.push_back(
+          {component, &dependencies[d], At(At(at, f::kDependencies), d)});
     }
-    const Json& packages = Array(object, f::kPackages, where);
-    for (size_t i = 0; i < packages.size(); ++i) {
-      std::string at = At(At(where, f::kPackages), i);
-      if (!packages[i].is_object()) Fields(packages[i], at, {});
-      auto inner = package.NewPackage(Text(packages[i], f::kName, at, false),
-                                      NewId(packages[i], at));
-      ReadLogicalPackage(packages[i], at, *inner);
-    }
+  }
+
+  void ReadClassOf(const Json& item, const std::string& at,
+                   LogicalPackage& package) {
+    auto cls =
+        package.NewClass(Text(item, f::kName, at, false), NewId(item, at));
+    ReadClass(item, at, *cls);
   }
 
   void ReadClass(const Json& object, const std::string& where, Class& cls) {
