@@ -49,7 +49,7 @@ const automation::MemberTable<AddIn>& AddIn::Members() {
            [](AddIn& self, Args&) { return Variant(self.RegistryKey()); }},
           {orel::add_in::kServer, "Server", CallKind::kPropertyGet,
            [](AddIn& self, Args&) { return Variant(self.Server()); }},
-          {orel::add_in::kHelpText, "HelpFile", CallKind::kPropertyGet,
+          {orel::add_in::kHelpText, "HelpText", CallKind::kPropertyGet,
            [](AddIn& self, Args&) {
              return Variant(self.description_.help_text);
            }},
@@ -62,7 +62,7 @@ const automation::MemberTable<AddIn>& AddIn::Members() {
            [](AddIn& self, Args&) {
              return Variant(self.description_.language_add_in);
            }},
-          {orel::add_in::kIsActive, "Active", CallKind::kPropertyGet,
+          {orel::add_in::kIsActive, "IsActive", CallKind::kPropertyGet,
            [](AddIn& self, Args&) {
              return Variant(self.description_.active);
            }},

@@ -50,7 +50,7 @@ const automation::MemberTable<Application>& Application::Members() {
           {orel::application::kAddInManager, "AddInManager",
            CallKind::kPropertyGet,
            [](Application& self, Args&) { return Variant(self.add_ins_); }},
-          {orel::application::kLog, "WriteErrorLog", CallKind::kMethod,
+          {orel::application::kLog, "Log", CallKind::kMethod,
            [](Application& self, Args& args) {
              self.Log(automation::CStr(automation::RequiredArg(args, 0)));
              return Variant();

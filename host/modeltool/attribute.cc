@@ -16,7 +16,7 @@ const automation::MemberTable<Attribute>& Attribute::Members() {
   static const automation::MemberTable<Attribute> table(
       "Attribute",
       WithElementMembers({
-          {orel::owner::kOfAttribute, "GetParentClass", CallKind::kMethod,
+          {orel::owner::kOfAttribute, "OwnerClass", CallKind::kMethod,
            [](Attribute& self, Args&) { return Variant(self.ContextClass()); }},
           {automation::kNamedOnly, "Type", CallKind::kPropertyGet,
            [](Attribute& self, Args&) { return Variant(self.type_); }},
@@ -25,9 +25,9 @@ const automation::MemberTable<Attribute>& Attribute::Members() {
              self.type_ = automation::CStr(automation::PutValue(args));
              return Variant();
            }},
-          {automation::kNamedOnly, "InitValue", CallKind::kPropertyGet,
+          {automation::kNamedOnly, "InitialValue", CallKind::kPropertyGet,
            [](Attribute& self, Args&) { return Variant(self.initial_value_); }},
-          {automation::kNamedOnly, "InitValue", CallKind::kPropertyPut,
+          {automation::kNamedOnly, "InitialValue", CallKind::kPropertyPut,
            [](Attribute& self, Args& args) {
              self.initial_value_ = automation::CStr(automation::PutValue(args));
              return Variant();

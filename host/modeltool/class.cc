@@ -197,26 +197,25 @@ const automation::MemberTable<Class>& Class::Members() {
   static const automation::MemberTable<Class> table(
       "Class",
       WithElementMembers({
-          {orel::class_::kComponents, "GetAssignedModules", CallKind::kMethod,
+          {orel::class_::kComponents, "Components", CallKind::kMethod,
            [](Class& self, Args&) {
              return Variant(
                  ElementCollection<Component, std::weak_ptr<Component>>::Of(
                      self.Self(), self.components_));
            }},
-          {orel::class_::kAssignToComponent, "AddAssignedModule",
-           CallKind::kMethod,
+          {orel::class_::kAssignToComponent, "AssignTo", CallKind::kMethod,
            [](Class& self, Args& args) {
              auto component = ElementArg<Component>(RequiredArg(args, 0));
              if (!component)
                throw automation::Error(automation::kObjectRequired);
              return Variant(self.AssignTo(component));
            }},
-          {automation::kNamedOnly, "RemoveAssignedModule", CallKind::kMethod,
+          {automation::kNamedOnly, "UnassignFrom", CallKind::kMethod,
            [](Class& self, Args& args) {
              return Variant(self.UnassignFrom(
                  ElementArg<Component>(RequiredArg(args, 0))));
            }},
-          {orel::class_::kPackage, "ParentCategory", CallKind::kPropertyGet,
+          {orel::class_::kPackage, "Package", CallKind::kPropertyGet,
            [](Class& self, Args&) { return Variant(self.Package()); }},
           {orel::class_::kAddInName, "AddInName", CallKind::kPropertyGet,
            [](Class& self, Args&) { return Variant(self.AddInName()); }},

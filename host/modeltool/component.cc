@@ -72,17 +72,17 @@ const automation::MemberTable<Component>& Component::Members() {
              self.language_ = automation::CStr(automation::PutValue(args));
              return Variant();
            }},
-          {orel::component::kClasses, "GetAssignedClasses", CallKind::kMethod,
+          {orel::component::kClasses, "Classes", CallKind::kMethod,
            [](Component& self, Args&) {
              return Variant(ElementCollection<Class, std::weak_ptr<Class>>::Of(
                  self.Self(), self.classes_));
            }},
           {orel::component::kModel, "Model", CallKind::kPropertyGet,
            [](Component& self, Args&) { return Variant(self.GetModel()); }},
-          {orel::component::kComponentPackage, "ParentComponentPackage",
+          {orel::component::kComponentPackage, "Package",
            CallKind::kPropertyGet,
            [](Component& self, Args&) { return Variant(self.Package()); }},
-          {orel::component::kDependencies, "GetDependencies", CallKind::kMethod,
+          {orel::component::kDependencies, "Dependencies", CallKind::kMethod,
            [](Component& self, Args&) {
              return Variant(ElementCollection<Dependency>::Of(
                  self.Self(), self.dependencies_));

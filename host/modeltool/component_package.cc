@@ -47,13 +47,13 @@ const automation::MemberTable<ComponentPackage>& ComponentPackage::Members() {
   static const automation::MemberTable<ComponentPackage> table(
       "ComponentPackage",
       WithElementMembers({
-          {orel::component_package::kComponents, "GetComponents",
+          {orel::component_package::kComponents, "Components",
            CallKind::kMethod,
            [](ComponentPackage& self, Args&) {
              return Variant(ElementCollection<Component>::Of(self.Self(),
                                                              self.components_));
            }},
-          {orel::component_package::kNewComponent, "AddComponent",
+          {orel::component_package::kNewComponent, "NewComponent",
            CallKind::kMethod,
            [](ComponentPackage& self, Args& args) {
              return Variant(self.NewComponent(

@@ -19,9 +19,9 @@ const automation::MemberTable<Dependency>& Dependency::Members() {
            [](Dependency& self, Args&) {
              return Variant(self.IsComponentDependency());
            }},
-          {orel::dependency::kSupplier, "GetSupplier", CallKind::kMethod,
+          {orel::dependency::kSupplier, "Supplier", CallKind::kMethod,
            [](Dependency& self, Args&) { return Variant(self.Supplier()); }},
-          {automation::kNamedOnly, "GetClient", CallKind::kMethod,
+          {automation::kNamedOnly, "Client", CallKind::kMethod,
            [](Dependency& self, Args&) { return Variant(self.Client()); }},
       }));
   return table;

@@ -84,7 +84,7 @@ const std::vector<ElementMember>& ElementMembers() {
          self.SetName(CStr(automation::PutValue(args)));
          return Variant();
        }},
-      {orel::element::kUniqueId, "UniqueID", CallKind::kPropertyGet,
+      {orel::element::kUniqueId, "UniqueId", CallKind::kPropertyGet,
        [](Element& self, Args&) { return Variant(self.UniqueId()); }},
       {automation::kNamedOnly, orel::element::kSetUniqueId, CallKind::kMethod,
        [](Element& self, Args& args) {
@@ -109,24 +109,26 @@ const std::vector<ElementMember>& ElementMembers() {
        CallKind::kMethod, ContextClassOf},
       {automation::kNamedOnly, orel::element::kParentClass,
        CallKind::kPropertyGet, ContextClassOf},
-      {orel::element::kFindToolProperty, "FindProperty", CallKind::kMethod,
+      {orel::element::kFindToolProperty, "FindToolProperty", CallKind::kMethod,
        [](Element& self, Args& args) {
          return Variant(self.FindToolProperty(CStr(RequiredArg(args, 0)),
                                               CStr(RequiredArg(args, 1))));
        }},
-      {orel::element::kToolPropertyValue, "GetPropertyValue", CallKind::kMethod,
+      {orel::element::kToolPropertyValue, "ToolPropertyValue",
+       CallKind::kMethod,
        [](Element& self, Args& args) {
          return Variant(self.ToolPropertyValue(CStr(RequiredArg(args, 0)),
                                                CStr(RequiredArg(args, 1))));
        }},
-      {orel::element::kCreateToolProperty, "CreateProperty", CallKind::kMethod,
+      {orel::element::kCreateToolProperty, "CreateToolProperty",
+       CallKind::kMethod,
        [](Element& self, Args& args) {
          return Variant(self.CreateToolProperty(
              CStr(RequiredArg(args, 0)), CStr(RequiredArg(args, 1)),
              CStr(RequiredArg(args, 2)),
              CStr(automation::OptionalArg(args, 3, "String"))));
        }},
-      {orel::element::kOverrideToolProperty, "OverrideProperty",
+      {orel::element::kOverrideToolProperty, "OverrideToolProperty",
        CallKind::kMethod,
        [](Element& self, Args& args) {
          self.OverrideToolProperty(CStr(RequiredArg(args, 0)),
@@ -134,8 +136,7 @@ const std::vector<ElementMember>& ElementMembers() {
                                    CStr(RequiredArg(args, 2)));
          return Variant(true);
        }},
-      {orel::element::kToolProperties, "GetToolProperties",
-       CallKind::kPropertyGet,
+      {orel::element::kToolProperties, "ToolProperties", CallKind::kPropertyGet,
        [](Element& self, Args&) {
          return Variant(ElementCollection<ToolProperty>::Of(
              self.SharedElement(), self.ToolProperties()));

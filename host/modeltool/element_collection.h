@@ -112,17 +112,17 @@ class ElementCollection
                return Variant(
                    self.At(automation::CLng(automation::RequiredArg(args, 0))));
              }},
-            {names::kIndexOfName, "FindFirst", CallKind::kMethod,
+            {names::kIndexOfName, "IndexOfName", CallKind::kMethod,
              [](ElementCollection& self, Args& args) {
                return Variant(self.IndexOfName(
                    automation::CStr(automation::RequiredArg(args, 0))));
              }},
-            {names::kFindByName, "GetFirst", CallKind::kMethod,
+            {names::kFindByName, "FindByName", CallKind::kMethod,
              [](ElementCollection& self, Args& args) {
                return Variant(self.FindByName(
                    automation::CStr(automation::RequiredArg(args, 0))));
              }},
-            {names::kFindByUniqueId, "GetWithUniqueID", CallKind::kMethod,
+            {names::kFindByUniqueId, "FindByUniqueId", CallKind::kMethod,
              [](ElementCollection& self, Args& args) {
                return Variant(self.FindByUniqueId(
                    automation::CStr(automation::RequiredArg(args, 0))));

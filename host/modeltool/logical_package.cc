@@ -45,7 +45,7 @@ const automation::MemberTable<LogicalPackage>& LogicalPackage::Members() {
   static const automation::MemberTable<LogicalPackage> table(
       "LogicalPackage",
       WithElementMembers({
-          {orel::logical_package::kClasses, "GetClasses", CallKind::kMethod,
+          {orel::logical_package::kClasses, "Classes", CallKind::kMethod,
            [](LogicalPackage& self, Args&) {
              return Variant(
                  ElementCollection<Class>::Of(self.Self(), self.classes_));

@@ -342,7 +342,7 @@ const automation::MemberTable<Model>& Model::Members() {
            [](Model& self, Args&) { return Variant(self.name_); }},
           {orel::element::kApplication, "Application", CallKind::kPropertyGet,
            [](Model& self, Args&) { return Variant(self.GetApplication()); }},
-          {orel::model::kAllComponents, "GetAllComponents", CallKind::kMethod,
+          {orel::model::kAllComponents, "AllComponents", CallKind::kMethod,
            [](Model& self, Args&) {
              auto model = self.Self();
              return Variant(ElementCollection<Component>::Of(
@@ -350,7 +350,7 @@ const automation::MemberTable<Model>& Model::Members() {
                    return model->Find<Component>(id);
                  }));
            }},
-          {orel::model::kAllClasses, "GetAllClasses", CallKind::kMethod,
+          {orel::model::kAllClasses, "AllClasses", CallKind::kMethod,
            [](Model& self, Args&) {
              auto model = self.Self();
              return Variant(ElementCollection<Class>::Of(
@@ -358,28 +358,27 @@ const automation::MemberTable<Model>& Model::Members() {
                    return model->Find<Class>(id);
                  }));
            }},
-          {orel::model::kSelectedComponents, "GetSelectedComponents",
+          {orel::model::kSelectedComponents, "SelectedComponents",
            CallKind::kMethod,
            [](Model& self, Args&) {
              return Variant(
                  ElementCollection<Component, std::weak_ptr<Component>>::Of(
                      self.Self(), self.selected_components_));
            }},
-          {orel::model::kSelectedComponentPackages,
-           "GetSelectedComponentPackages", CallKind::kMethod,
+          {orel::model::kSelectedComponentPackages, "SelectedComponentPackages",
+           CallKind::kMethod,
            [](Model& self, Args&) {
              return Variant(
                  ElementCollection<ComponentPackage,
                                    std::weak_ptr<ComponentPackage>>::
                      Of(self.Self(), self.selected_component_packages_));
            }},
-          {orel::model::kSelectedClasses, "GetSelectedClasses",
-           CallKind::kMethod,
+          {orel::model::kSelectedClasses, "SelectedClasses", CallKind::kMethod,
            [](Model& self, Args&) {
              return Variant(ElementCollection<Class, std::weak_ptr<Class>>::Of(
                  self.Self(), self.selected_classes_));
            }},
-          {orel::model::kSelectedLogicalPackages, "GetSelectedLogicalPackages",
+          {orel::model::kSelectedLogicalPackages, "SelectedLogicalPackages",
            CallKind::kMethod,
            [](Model& self, Args&) {
              return Variant(
@@ -418,7 +417,7 @@ const automation::MemberTable<Model>& Model::Members() {
                  automation::CBool(automation::PutValue(args));
              return Variant();
            }},
-          {orel::model::kFilePath, "GetFileName", CallKind::kPropertyGet,
+          {orel::model::kFilePath, "FilePath", CallKind::kPropertyGet,
            [](Model& self, Args&) { return Variant(self.file_path_); }},
           {orel::model::kSave, "Save", CallKind::kMethod,
            [](Model& self, Args&) {

@@ -41,7 +41,7 @@ const automation::MemberTable<Operation>& Operation::Members() {
   static const automation::MemberTable<Operation> table(
       "Operation",
       WithElementMembers({
-          {orel::owner::kOfOperation, "GetParentClass", CallKind::kMethod,
+          {orel::owner::kOfOperation, "OwnerClass", CallKind::kMethod,
            [](Operation& self, Args&) { return Variant(self.ContextClass()); }},
           {automation::kNamedOnly, "ReturnType", CallKind::kPropertyGet,
            [](Operation& self, Args&) { return Variant(self.return_type_); }},

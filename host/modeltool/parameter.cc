@@ -19,9 +19,9 @@ const automation::MemberTable<Parameter>& Parameter::Members() {
              self.type_ = automation::CStr(automation::PutValue(args));
              return Variant();
            }},
-          {automation::kNamedOnly, "InitValue", CallKind::kPropertyGet,
+          {automation::kNamedOnly, "DefaultValue", CallKind::kPropertyGet,
            [](Parameter& self, Args&) { return Variant(self.default_value_); }},
-          {automation::kNamedOnly, "InitValue", CallKind::kPropertyPut,
+          {automation::kNamedOnly, "DefaultValue", CallKind::kPropertyPut,
            [](Parameter& self, Args& args) {
              self.default_value_ = automation::CStr(automation::PutValue(args));
              return Variant();

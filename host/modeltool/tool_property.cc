@@ -22,7 +22,7 @@ const automation::MemberTable<ToolProperty>& ToolProperty::Members() {
   static const automation::MemberTable<ToolProperty> table(
       "ToolProperty",
       {
-          {names::kTool, "ToolName", CallKind::kPropertyGet,
+          {names::kTool, "Tool", CallKind::kPropertyGet,
            [](ToolProperty& self, Args&) { return Variant(self.tool_); }},
           {names::kName, "Name", CallKind::kPropertyGet,
            [](ToolProperty& self, Args&) { return Variant(self.name_); }},
