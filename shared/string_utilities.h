@@ -11,6 +11,9 @@ namespace kelqln {
 // white space count as visible, as in the trimming of the original tool).
 bool IsBlank(std::string_view text);
 
+// `text` without the blanks (spaces) at both ends.
+std::string Trim(std::string_view text);
+
 // `text` with every occurrence of `find` replaced by `replacement`, matched
 // case-sensitively from left to right. The search goes on after each inserted
 // replacement, so a replacement that contains `find` is not replaced again and
