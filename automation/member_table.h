@@ -10,6 +10,7 @@
 #include <string_view>
 #include <unordered_map>
 #include <utility>
+#include <vector>
 
 #include "automation/case_folding.h"
 #include "automation/dispatch.h"
@@ -35,6 +36,11 @@ class MemberTable {
   };
 
   MemberTable(std::string type_name, std::initializer_list<Row> rows)
+      : MemberTable(std::move(type_name), std::vector<Row>(rows)) {}
+
+  // For a table put together from several lists, such as a class's own
+  // members followed by those of an interface it also answers.
+  MemberTable(std::string type_name, const std::vector<Row>& rows)
       : type_name_(std::move(type_name)) {
     DispId next_named = kFirstNamedDispId;
     for (const Row& row : rows) {
