@@ -38,8 +38,8 @@ class MemberTable {
   MemberTable(std::string type_name, std::initializer_list<Row> rows)
       : MemberTable(std::move(type_name), std::vector<Row>(rows)) {}
 
-  // For a table put together from several lists, such as a class's own
-  // members followed by those of an interface it also answers.
+  // For classes that share rows with others (a family of classes with common
+  // members builds each table from the common rows plus its own).
   MemberTable(std::string type_name, const std::vector<Row>& rows)
       : type_name_(std::move(type_name)) {
     DispId next_named = kFirstNamedDispId;
