@@ -329,6 +329,30 @@ TEST_F(CodeViewTest, TheExampleOfTheFormatsDocumentIsValidCode) {
   EXPECT_GE(model_->Classes().size(), 2u);
 }
 
+TEST_F(CodeViewTest, TheDefaultRegistryInstallsTheDescriptionAddIns) {
+  platform::UseRegistryFile(std::string(KELQLN_SOURCE_ROOT) +
+                            "/data/registry.reg");
+  app_ = modeltool::Application::Create();
+  modeltool::LoadAddInsFromRegistry(*app_->AddIns(),
+                                    (directory_ / "settings.json").string());
+  app_->SetCurrentModel(model_);
+  EXPECT_EQ(CStr(automation::GetByName(Server("VC++"),
+                                       cv::rte_server::kLanguageInfo)),
+            "VC++: code described in JSON files");
+  EXPECT_EQ(ErrorOf([&] {
+              CallByName(Server("VC++"), cv::rte_server::kOnNewComponent,
+                         Object(app_), Variant());
+            }),
+            automation::kNoSuchMember);
+  Object made = automation::CObj(CallByName(Server("Visual Basic"),
+                                            cv::rte_server::kOnNewComponent,
+                                            Object(app_), Variant()));
+  EXPECT_EQ(Items(made).size(), 1u);
+  WriteCode(BaseDescription());
+  EXPECT_TRUE(Vanished(Update(Project())).empty());
+  EXPECT_EQ(model_->Classes().size(), 4u);
+}
+
 TEST(VanishedElementCollectorTest, ListsEachElementOnceAndAClassAsAWhole) {
   modeltool::SampleModel s;
   auto collector = std::make_shared<VanishedElementCollector>();
