@@ -238,16 +238,6 @@ TEST_F(AddInServicesTest, FurtherAddInsAreReadUpToTheFirstGap) {
   EXPECT_EQ(GetAddInServers(app_, "Missing", "")->Items().Count(), 0);
 }
 
-TEST_F(AddInServicesTest, GapAtTwoLeavesOnlyTheFirst) {
-  Install({"C++", "One", "Three"},
-          AddInKey("One", RoundTrip()) + AddInKey("Three", RoundTrip()) +
-              "[HKEY_LOCAL_MACHINE\\SOFTWARE\\Quenta Software\\Orel\\AddIns\\"
-              "C++\\AddIns]\n\"1\"=\"One\"\n\"2\"=\"\"\n\"3\"=\"Three\"\n\n");
-  auto servers = GetAddInServers(app_, "C++", "QLN");
-  ASSERT_EQ(servers->Items().Count(), 1);
-  EXPECT_EQ(servers->Items().KeyAt(1), "One");
-}
-
 TEST_F(AddInServicesTest, ExcludedStereotypesAreTrimmedAndKeptOnce) {
   struct Case {
     std::string value;  // "" for no value
