@@ -31,6 +31,7 @@
 #include "platform/registry_store.h"
 #include "reporting/reporter_api_dispatch.h"
 #include "reporting/shared_simplereporter.h"
+#include "tests/support/error_of.h"
 #include "tests/support/recording_object.h"
 
 namespace kelqln {
@@ -44,18 +45,10 @@ using automation::CallKind;
 using automation::DispId;
 using automation::Object;
 using automation::Variant;
-using testing::RecordingObject;
+using testing_support::ErrorOf;
+using testing_support::RecordingObject;
 
 const std::string kAddInsKey = modeltool::kAddInsKey;
-
-int ErrorOf(const std::function<void()>& f) {
-  try {
-    f();
-  } catch (const automation::Error& error) {
-    return error.Number();
-  }
-  return 0;
-}
 
 std::string FileText(const fs::path& path) {
   std::ifstream in(path, std::ios::binary);

@@ -19,6 +19,7 @@
 #include "platform/message_pump.h"
 #include "reporting/reporter_api_dispatch.h"
 #include "reporting/reporter_classes.h"
+#include "tests/support/error_of.h"
 #include "tests/support/recording_object.h"
 
 namespace kelqln {
@@ -29,7 +30,8 @@ using automation::CallKind;
 using automation::CStr;
 using automation::DispId;
 using automation::Variant;
-using testing::RecordingObject;
+using testing_support::ErrorOf;
+using testing_support::RecordingObject;
 using Texts = std::vector<std::string>;
 namespace names = external::reporter_api;
 namespace pd = external::progress_display;
@@ -265,13 +267,8 @@ TEST_F(APIProgressTest, RaiseCancelSetsTheFlagRaisesTheEventAndTellsTheTarget) {
 }
 
 TEST_F(APIProgressTest, SummaryPageNeedsTheWizard) {
-  int number = 0;
-  try {
-    progress_->ShowSummaryPage();
-  } catch (const automation::Error& error) {
-    number = error.Number();
-  }
-  EXPECT_EQ(number, automation::kCannotCreateObject);
+  EXPECT_EQ(ErrorOf([this] { progress_->ShowSummaryPage(); }),
+            automation::kCannotCreateObject);
 
   struct CountingWizard : WizardBridge {
     void DisplaySummaryPage() override { ++shown; }
@@ -294,7 +291,8 @@ TEST_F(APIProgressTest, ReportersAreCreatableByProgIdAndPassAsObjects) {
     EXPECT_EQ(ReporterObject(reporter), object);
     automation::UnregisterClass(server_class.prog_id);
   }
-  EXPECT_THROW(ReporterOf(RecordingObject::Create()), automation::Error);
+  EXPECT_EQ(ErrorOf([] { ReporterOf(RecordingObject::Create()); }),
+            automation::kTypeMismatch);
 }
 
 }  // namespace

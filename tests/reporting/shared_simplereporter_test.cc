@@ -9,6 +9,7 @@
 #include "automation/call.h"
 #include "automation/error.h"
 #include "external/reporter_api.h"
+#include "tests/support/error_of.h"
 
 namespace kelqln {
 namespace {
@@ -103,13 +104,8 @@ TEST(SharedSimpleReporterTest, TheCountsOverflowAt32768) {
     };
     std::string text = "x";
     for (int i = 0; i < 32767; ++i) report(text);
-    int number = 0;
-    try {
-      report(text);
-    } catch (const automation::Error& error) {
-      number = error.Number();
-    }
-    EXPECT_EQ(number, automation::kOverflow);
+    EXPECT_EQ(testing_support::ErrorOf([&] { report(text); }),
+              automation::kOverflow);
     EXPECT_EQ(errors ? reporter->ErrorCount() : reporter->WarningCount(),
               32767);
   }
