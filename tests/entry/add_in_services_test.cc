@@ -18,6 +18,7 @@
 #include "host/modeltool/application.h"
 #include "platform/registry.h"
 #include "platform/registry_store.h"
+#include "tests/support/error_of.h"
 
 namespace kelqln {
 namespace {
@@ -157,12 +158,9 @@ TEST_F(AddInServicesTest, ServerOfAMissingAddInRaisesOnlyWithATag) {
   Install({"NoServer", "Unregistered"},
           AddInKey("Unregistered", {"\"ServerProgId\"=\"kelqlntest.None\""}));
   EXPECT_EQ(GetAddInServer(app_, "Missing", ""), nullptr);
-  try {
-    GetAddInServer(app_, "Missing", "QLN");
-    ADD_FAILURE() << "no error for a missing add-in with a tag";
-  } catch (const automation::Error& error) {
-    EXPECT_EQ(error.Number(), automation::kObjectNotSet);
-  }
+  EXPECT_EQ(
+      testing_support::ErrorOf([&] { GetAddInServer(app_, "Missing", "QLN"); }),
+      automation::kObjectNotSet);
   // Servers that cannot be made are no server.
   EXPECT_EQ(GetAddInServer(app_, "NoServer", "QLN"), nullptr);
   EXPECT_EQ(GetAddInServer(app_, "Unregistered", ""), nullptr);
