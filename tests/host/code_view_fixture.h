@@ -3,7 +3,7 @@
 // model with the component App whose code is `app.json` beside the model
 // file, a reporter that records its lines, and the system's run of an
 // update (open, project update, component updates) through late-bound
-// members only.
+// members only. The reporter is a recording double.
 #ifndef KELQLN_TESTS_HOST_CODE_VIEW_FIXTURE_H_
 #define KELQLN_TESTS_HOST_CODE_VIEW_FIXTURE_H_
 
@@ -31,6 +31,7 @@
 #include "platform/registry.h"
 #include "platform/registry_store.h"
 #include "sample_model.h"
+#include "tests/support/recording_object.h"
 
 namespace host::codeview {
 
@@ -43,34 +44,6 @@ using automation::Object;
 using automation::Variant;
 using Json = nlohmann::json;
 using Lines = std::vector<std::string>;
-
-// A reporter that keeps what it is told, by kind.
-class RecordingReporter : public automation::DispatchImpl<RecordingReporter> {
- public:
-  static const automation::MemberTable<RecordingReporter>& Members() {
-    using automation::Args;
-    using automation::CallKind;
-    auto row = [](const char* name, Lines RecordingReporter::*lines) {
-      return automation::MemberTable<RecordingReporter>::Row{
-          automation::kNamedOnly, name, CallKind::kMethod,
-          [lines](RecordingReporter& self, Args& args) {
-            (self.*lines).push_back(CStr(automation::RequiredArg(args, 0)));
-            return Variant();
-          }};
-    };
-    static const automation::MemberTable<RecordingReporter> table(
-        "RecordingReporter", {row("Log", &RecordingReporter::logs),
-                              row("Warning", &RecordingReporter::warnings),
-                              row("Error", &RecordingReporter::errors)});
-    return table;
-  }
-  void Clear() { logs.clear(), warnings.clear(), errors.clear(); }
-  bool Silent() const {
-    return logs.empty() && warnings.empty() && errors.empty();
-  }
-
-  Lines logs, warnings, errors;
-};
 
 // The code of App as the tests start from: shapes.h with Shape, IDrawable
 // and Circle; canvas.h with Canvas. Canvas and Shape are the two ends of the
@@ -170,7 +143,7 @@ class CodeViewTest : public ::testing::Test {
     modeltool::LoadAddInsFromRegistry(*app_->AddIns(),
                                       (directory_ / "settings.json").string());
     NewModel();
-    reporter_ = std::make_shared<RecordingReporter>();
+    reporter_ = testing_support::RecordingObject::Create();
   }
 
   // A new current model, saved beside the code, holding only the component.
@@ -256,6 +229,29 @@ class CodeViewTest : public ::testing::Test {
     return collector;
   }
 
+  // The texts the code view reported through `operation` ("Log",
+  // "Warning", "Error"), in order.
+  Lines Reported(const char* operation) const {
+    Lines lines;
+    for (const auto& call : reporter_->CallsTo(operation)) {
+      lines.push_back(CStr(call.args.at(0)));
+    }
+    return lines;
+  }
+  Lines Logs() const { return Reported("Log"); }
+  Lines Warnings() const { return Reported("Warning"); }
+  Lines Errors() const { return Reported("Error"); }
+  // Every line, for the message of a failed expectation.
+  std::string Report() const {
+    std::string text;
+    for (const char* operation : {"Log", "Warning", "Error"}) {
+      for (const std::string& line : Reported(operation)) {
+        text += std::string(operation) + ": " + line + "\n";
+      }
+    }
+    return text;
+  }
+
   std::shared_ptr<modeltool::Class> ModelClass(const std::string& name) const {
     for (const auto& cls : model_->Classes()) {
       if (cls->Name() == name) return cls;
@@ -268,7 +264,7 @@ class CodeViewTest : public ::testing::Test {
   std::shared_ptr<modeltool::Application> app_;
   std::shared_ptr<modeltool::Model> model_;
   std::shared_ptr<modeltool::Component> component_;
-  std::shared_ptr<RecordingReporter> reporter_;
+  std::shared_ptr<testing_support::RecordingObject> reporter_;
 };
 
 }  // namespace host::codeview

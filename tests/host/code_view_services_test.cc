@@ -12,7 +12,7 @@ namespace {
 using automation::CBool;
 using automation::CLng;
 using automation::GetObject;
-using modeltool::ErrorOf;
+using testing_support::ErrorOf;
 
 TEST_F(CodeViewTest, AComponentsProjectComesFromItsProjectFile) {
   Object server = Server("VC++");
@@ -49,7 +49,7 @@ TEST_F(CodeViewTest, AComponentsProjectComesFromItsProjectFile) {
       automation::CObj(CallByName(server, cv::rte_server::kCodeViewProject,
                                   Object(bare), Object(reporter_))),
       nullptr);
-  EXPECT_EQ(reporter_->warnings,
+  EXPECT_EQ(Warnings(),
             Lines{"The component Bare has no project file: its tool property "
                   "ProjectFile of the tool VC++ is not set"});
   // Nor is another language's project file taken.
@@ -100,7 +100,7 @@ TEST_F(CodeViewTest, OpenFailsWithOneClearErrorLineWhenTheCodeCannotBeRead) {
     fs::remove(CodePath());
     if (test.text) WriteFile(CodePath(), test.text);
     if (documents[i]) WriteCode(*documents[i]);
-    reporter_->Clear();
+    reporter_->calls.clear();
     Object project = Project();
     std::string description;
     EXPECT_EQ(ErrorOf(
@@ -112,10 +112,10 @@ TEST_F(CodeViewTest, OpenFailsWithOneClearErrorLineWhenTheCodeCannotBeRead) {
               test.number);
     EXPECT_NE(description.find(CodePath()), std::string::npos) << description;
     EXPECT_NE(description.find(test.problem), std::string::npos) << description;
-    ASSERT_EQ(reporter_->errors.size(), 1u);
-    EXPECT_EQ(reporter_->errors[0],
+    ASSERT_EQ(Errors().size(), 1u);
+    EXPECT_EQ(Errors()[0],
               "Cannot read the code of component App: " + description);
-    EXPECT_TRUE(reporter_->logs.empty() && reporter_->warnings.empty());
+    EXPECT_TRUE(Logs().empty() && Warnings().empty());
     // Until it can be read, the project has no components; an update raises
     // the same error.
     EXPECT_EQ(CLng(automation::Get(GetObject(project, cv::project::kComponents),
@@ -171,11 +171,10 @@ TEST_F(CodeViewTest, TheElementIndexFindsClassesByNameAndUniqueId) {
   WriteCode(code);
   automation::Call(project, cv::project::kOpen, Object(reporter_));
   Object collector = NewCollector();
-  reporter_->Clear();
+  reporter_->calls.clear();
   automation::Call(shape, cv::component::kUpdateModel, Object(model_),
                    Object(reporter_), collector, true);
-  EXPECT_EQ(reporter_->logs,
-            Lines{"Shape.x: type changed from \"int\" to \"long\""});
+  EXPECT_EQ(Logs(), Lines{"Shape.x: type changed from \"int\" to \"long\""});
   EXPECT_TRUE(Vanished(collector).empty());
   EXPECT_EQ(ModelClass("Canvas")->HasRelationships().size(), 1u);
 }
@@ -226,14 +225,14 @@ TEST_F(CodeViewTest, OneServerClassServesEachAddInWithItsOwnSettings) {
     EXPECT_EQ(CBool(answer), query.include);
     EXPECT_EQ(CBool(args[4]), query.include);
   }
-  EXPECT_EQ(reporter_->logs.size(), 3u);
+  EXPECT_EQ(Logs().size(), 3u);
   // As the system asks about a model class: 0 stands for no reporter.
   Object generator = automation::CObj(
       automation::GetByName(cpp, cv::rte_server::kStatementGenerator));
   EXPECT_FALSE(CBool(automation::Call(
       generator, cv::statement_generator::kProcess, Object(component_),
       Object(iface), int16_t{0}, int16_t{0}, Object())));
-  EXPECT_EQ(reporter_->logs.size(), 3u);
+  EXPECT_EQ(Logs().size(), 3u);
 
   // New components: only where the registry allows them.
   EXPECT_EQ(ErrorOf([&] {
@@ -323,8 +322,8 @@ TEST_F(CodeViewTest, TheExampleOfTheFormatsDocumentIsValidCode) {
   size_t end = document.find("```", start);
   WriteFile(CodePath(), document.substr(start, end - start));
   Object collector = Update(Project());
-  EXPECT_TRUE(reporter_->errors.empty());
-  EXPECT_TRUE(reporter_->warnings.empty()) << reporter_->warnings.front();
+  EXPECT_TRUE(Errors().empty());
+  EXPECT_TRUE(Warnings().empty()) << Report();
   EXPECT_TRUE(Vanished(collector).empty());
   EXPECT_GE(model_->Classes().size(), 2u);
 }

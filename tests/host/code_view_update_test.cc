@@ -20,9 +20,9 @@ TEST_F(CodeViewTest, AFirstUpdateMakesTheClassesAndMembersOfTheCode) {
   Object collector = Update(Project());
 
   EXPECT_TRUE(Vanished(collector).empty());
-  EXPECT_TRUE(reporter_->warnings.empty()) << reporter_->warnings.front();
-  EXPECT_TRUE(reporter_->errors.empty());
-  EXPECT_FALSE(reporter_->logs.empty());
+  EXPECT_TRUE(Warnings().empty()) << Report();
+  EXPECT_TRUE(Errors().empty());
+  EXPECT_FALSE(Logs().empty());
 
   for (const char* name : {"Shape", "IDrawable", "Circle", "Canvas"}) {
     auto cls = ModelClass(name);
@@ -80,11 +80,11 @@ TEST_F(CodeViewTest, ASecondIdenticalUpdateChangesAndCollectsNothing) {
   Update(Project());
   model_->Save();
   std::string before = ReadFile(ModelPath());
-  reporter_->Clear();
+  reporter_->calls.clear();
 
   Object collector = Update(Project());
   EXPECT_TRUE(Vanished(collector).empty());
-  EXPECT_TRUE(reporter_->Silent()) << reporter_->logs.front();
+  EXPECT_TRUE(reporter_->calls.empty()) << Report();
   model_->Save();
   EXPECT_EQ(ReadFile(ModelPath()), before);
 
@@ -95,7 +95,7 @@ TEST_F(CodeViewTest, ASecondIdenticalUpdateChangesAndCollectsNothing) {
   component_ = model_->Find<modeltool::Component>(component_->UniqueId());
   collector = Update(Project());
   EXPECT_TRUE(Vanished(collector).empty());
-  EXPECT_TRUE(reporter_->Silent()) << reporter_->logs.front();
+  EXPECT_TRUE(reporter_->calls.empty()) << Report();
 }
 
 TEST_F(CodeViewTest, WhatTheCodeLosesGoesToTheCollectorAndStaysInTheModel) {
@@ -143,11 +143,11 @@ TEST_F(CodeViewTest, WhatTheCodeLosesGoesToTheCollectorAndStaysInTheModel) {
 
     test.change(code);
     WriteCode(code);
-    reporter_->Clear();
+    reporter_->calls.clear();
     Object collector = Update(Project());
     EXPECT_EQ(Vanished(collector), test.vanished);
     EXPECT_EQ(model_->ElementCount(), elements);
-    EXPECT_TRUE(reporter_->Silent()) << reporter_->logs.front();
+    EXPECT_TRUE(reporter_->calls.empty()) << Report();
   }
 }
 
@@ -189,9 +189,9 @@ TEST_F(CodeViewTest, TheEndsTwoClassesDeclareMakeOneAssociation) {
     EXPECT_EQ(back->IsNavigable(), test.navigable_back);
     EXPECT_EQ(back->Name(), test.navigable_back ? "canvas" : "");
 
-    reporter_->Clear();
+    reporter_->calls.clear();
     EXPECT_TRUE(Vanished(Update(Project())).empty());
-    EXPECT_TRUE(reporter_->Silent()) << reporter_->logs.front();
+    EXPECT_TRUE(reporter_->calls.empty()) << Report();
   }
 }
 
@@ -213,7 +213,7 @@ TEST_F(CodeViewTest, ChangedMembersAreUpdatedInPlace) {
   ClassIn(code, "Circle")["stereotype"] = "entity";
   ClassIn(code, "Canvas")["roles"][0]["cardinality"] = "1..*";
   WriteCode(code);
-  reporter_->Clear();
+  reporter_->calls.clear();
   Object collector = Update(Project());
 
   EXPECT_TRUE(Vanished(collector).empty());
@@ -234,7 +234,7 @@ TEST_F(CodeViewTest, ChangedMembersAreUpdatedInPlace) {
       "Context&, scale: double)",
       "Circle: stereotype changed from \"\" to \"entity\"",
       "Canvas.items: cardinality changed from \"0..*\" to \"1..*\""};
-  EXPECT_EQ(reporter_->logs, expected);
+  EXPECT_EQ(Logs(), expected);
 }
 
 TEST_F(CodeViewTest, ARelationToAClassTheModelDoesNotKnowIsAWarning) {
@@ -244,7 +244,7 @@ TEST_F(CodeViewTest, ARelationToAClassTheModelDoesNotKnowIsAWarning) {
       {{"name", "name"}, {"class", "std::string"}});
   WriteCode(code);
   Update(Project());
-  EXPECT_EQ(reporter_->warnings,
+  EXPECT_EQ(Warnings(),
             Lines{"Circle: CObject is not a class of the model; no inherit "
                   "relation to it"});
   EXPECT_EQ(ModelClass("Circle")->InheritRelations().size(), 1u);
@@ -256,9 +256,9 @@ TEST_F(CodeViewTest, ARelationToAClassTheModelDoesNotKnowIsAWarning) {
 
   // Once the model has the class, the relation is made.
   model_->RootLogicalPackage()->NewClass("CObject");
-  reporter_->Clear();
+  reporter_->calls.clear();
   Update(Project());
-  EXPECT_TRUE(reporter_->warnings.empty());
+  EXPECT_TRUE(Warnings().empty());
   EXPECT_EQ(ModelClass("Circle")->InheritRelations().size(), 2u);
 }
 
