@@ -1,5 +1,7 @@
 #include "host/codeview/round_trip_server.h"
 
+#include <functional>
+#include <string>
 #include <utility>
 
 #include "automation/error.h"
