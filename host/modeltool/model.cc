@@ -317,6 +317,7 @@ void Model::Save() {
     throw automation::Error(automation::kPathFileAccessError,
                             "The model has no file yet: save it under a name");
   }
+  if (saves_skipped_) return;
   WriteFileAtomically(file_path_, ModelWriter::ToText(*this));
 }
 
@@ -325,6 +326,7 @@ void Model::SaveAs(const std::string& path) {
     throw automation::Error(automation::kInvalidProcedureCall,
                             "A model file needs a name");
   }
+  if (saves_skipped_) return;
   WriteFileAtomically(path, ModelWriter::ToText(*this));
   file_path_ = path;
 }

@@ -134,6 +134,9 @@ class Model : public automation::DispatchImpl<Model> {
   void Save();
   // As Save, to `path`, which becomes the FilePath when the save succeeds.
   void SaveAs(const std::string& path);
+  // A trial run (a host's dry run): while set, Save and SaveAs write nothing
+  // and the file stays as it was, whoever asks for the save.
+  void SetSavesSkipped(bool skipped) { saves_skipped_ = skipped; }
 
   void SetUniqueIdGenerator(UniqueIdGenerator generator);
 
@@ -195,6 +198,7 @@ class Model : public automation::DispatchImpl<Model> {
   std::string default_language_;
   bool ask_for_backup_ = false;
   std::string file_path_;
+  bool saves_skipped_ = false;
 
   friend class Application;
 };
