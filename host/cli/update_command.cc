@@ -96,7 +96,11 @@ int UpdateCommand::Run() {
   std::string failure = StartRun(host.App(), selection, callback, report);
   host.App()->SetLogSink(nullptr);
   report.deleted = callback->Deleted();
-  if (!options_.quiet) PrintLines(report.summaries);
+  if (!options_.quiet) {
+    // The summary repeats lines of the log: a blank line sets it apart.
+    out_ << '\n';
+    PrintLines(report.summaries);
+  }
   PrintLines(report.warnings);
   PrintLines(report.errors);
 

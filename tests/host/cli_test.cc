@@ -3,7 +3,9 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <filesystem>
+#include <nlohmann/json.hpp>
 #include <string>
 #include <vector>
 
@@ -60,6 +62,23 @@ class CliTest : public ::testing::Test {
     return Run(options, input);
   }
   std::string Model() const { return ReadText(directory_ / "library.json"); }
+  void SetModel(const std::string& text) const {
+    WriteText(directory_ / "library.json", text);
+  }
+  // Inserts `text` into the model's text after the first `after`.
+  void EditModel(const std::string& after, const std::string& text) const {
+    std::string model = Model();
+    model.insert(model.find(after) + after.size(), text);
+    SetModel(model);
+  }
+  // The lines of `kelqln show` that contain `part`.
+  Lines Shown(const std::string& part) const {
+    Lines found;
+    for (const std::string& line : LinesOf(Run({"show", "library.json"}).out)) {
+      if (line.find(part) != std::string::npos) found.push_back(line);
+    }
+    return found;
+  }
 
   fs::path directory_;
 };
@@ -98,46 +117,35 @@ TEST_F(CliTest, ShowPrintsTheModelAsATree) {
 
 TEST_F(CliTest, NewMakesAModelReadyForUpdate) {
   fs::create_directories(directory_ / "models");
-  Result made = Run({"new", "models/shop.json", "--component", "Shop",
-                     "--language", "Visual Basic", "--project", "lending.json",
-                     "--registry", "registry.reg"});
+  std::vector<std::string> args = {
+      "new",        "models/shop.json", "--component", "Shop",
+      "--project",  "lending.json",     "--registry",  "registry.reg",
+      "--language", "Visual Basic"};
+  Result made = Run(args);
   ASSERT_EQ(made.code, 0) << made.err;
   EXPECT_EQ(made.out,
             "Created models/shop.json: component Shop (Visual Basic, project "
             "../lending.json).\n");
-  Result show = Run({"show", "models/shop.json"});
-  EXPECT_EQ(LinesOf(show.out),
-            (Lines{"Model shop", "Component View",
-                   "  component Shop (Visual Basic, project ../lending.json)",
-                   "Logical View"}));
+  Result update = Run(
+      {"update", "models/shop.json", "--registry", "registry.reg", "--quiet"});
+  EXPECT_EQ(update.code, 0) << update.out << update.err;
+  EXPECT_EQ(LinesOf(Run({"show", "models/shop.json"}).out)[2],
+            "  component Shop (Visual Basic, project ../lending.json)");
+  EXPECT_NE(Run({"show", "models/shop.json"}).out.find("class Catalog"),
+            std::string::npos);
 
-  std::string before = ReadText(directory_ / "models/shop.json");
-  struct Refusal {
-    std::vector<std::string> args;
-    std::string message;
-  };
-  for (const Refusal& refusal : std::vector<Refusal>{
-           {{"--language", "VC++"}, "models/shop.json: the file exists"},
-           {{"--language", "Cobol"},
-            "--language Cobol: no language add-in of that name is installed "
-            "(installed: VC++, Visual Basic)"}}) {
-    std::vector<std::string> args = {"new",
-                                     refusal.message.starts_with("models")
-                                         ? "models/shop.json"
-                                         : "models/other.json",
-                                     "--component",
-                                     "Shop",
-                                     "--project",
-                                     "x.json",
-                                     "--registry",
-                                     "registry.reg"};
-    args.insert(args.end(), refusal.args.begin(), refusal.args.end());
-    Result refused = Run(args);
-    EXPECT_EQ(refused.code, 2);
-    EXPECT_NE(refused.err.find(refusal.message), std::string::npos)
-        << refused.err;
-  }
-  EXPECT_EQ(ReadText(directory_ / "models/shop.json"), before);
+  const std::string made_model = ReadText(directory_ / "models/shop.json");
+  Result again = Run(args);
+  EXPECT_EQ(again.code, 2);
+  EXPECT_EQ(again.err, "kelqln: models/shop.json: the file exists already\n");
+  args[1] = "models/other.json";
+  args.back() = "Cobol";
+  Result unknown = Run(args);
+  EXPECT_EQ(unknown.code, 2);
+  EXPECT_EQ(unknown.err,
+            "kelqln: --language Cobol: no language add-in of that name is "
+            "installed (installed: VC++, Visual Basic)\n");
+  EXPECT_EQ(ReadText(directory_ / "models/shop.json"), made_model);
   EXPECT_FALSE(fs::exists(directory_ / "models/other.json"));
 }
 
@@ -168,7 +176,6 @@ TEST_F(CliTest, UnusableInputIsRefusedAndLeavesTheFilesAlone) {
            {{"update", "library.json", "--report", "no/dir/r.json"},
             "--report no/dir/r.json: "},
            {{"show", "broken.json"}, "kelqln: broken.json: "},
-           {{"frobnicate"}, "A subcommand is required"},
        }) {
     std::string model = ReadText(directory_ / "library.json");
     std::string broken = ReadText(directory_ / "broken.json");
@@ -178,6 +185,201 @@ TEST_F(CliTest, UnusableInputIsRefusedAndLeavesTheFilesAlone) {
     EXPECT_EQ(refused.out, "");
     EXPECT_EQ(ReadText(directory_ / "library.json"), model);
     EXPECT_EQ(ReadText(directory_ / "broken.json"), broken);
+  }
+}
+
+// The log of a run of the example that deletes everything that vanished.
+const Lines kUpdateLog = {
+    "----------------------------------------",
+    "Language VC++",
+    "Updating component Lending from project Lending",
+    "Reading book.h",
+    "Class Catalog added to package Lending and component Lending",
+    "Book.Describe: parameters changed from () to (verbose: bool)",
+    "Catalog: operation Find(isbn: std::string) added",
+    "Catalog: has-relationship books to Book added",
+    "Reading member.h",
+    "Deleting class Fine - done",
+    "Deleting attribute pages - done",
+    "Deleting role reservations - done",
+    "Deleting association reserves - done",
+    "Deleting role borrower - done",
+    "The model update is finished.",
+    "The summary lists the result of every component.",
+    "The update finished with 0 error(s) and 0 warning(s)."};
+
+TEST_F(CliTest, UpdatePrintsTheLogThenSummaryWarningsAndErrors) {
+  // One component without code, one whose code file is missing.
+  EditModel("\"components\": [",
+            R"({"id": "{C-UNBOUND}", "name": "Unbound", "language": "VC++"},
+               {"id": "{C-BROKEN}", "name": "Broken", "language": "VC++",
+                "toolProperties": [{"tool": "VC++", "name": "ProjectFile",
+                  "value": "missing.json", "type": "String"}]},)");
+  const std::string warning =
+      "Warning: The component Unbound has no project file: its tool property "
+      "ProjectFile of the tool VC++ is not set";
+  const std::string error =
+      "Error: Cannot read the code of component Broken: missing.json: the "
+      "file does not exist";
+  Lines expected = {warning, kUpdateLog[0], kUpdateLog[1],
+                    "Updating component Broken from project missing", error};
+  expected.insert(expected.end(), kUpdateLog.begin() + 2, kUpdateLog.end());
+  expected.insert(
+      expected.end(),
+      {"", "Components updated:", "Broken", "Lending", "Lending: updated",
+       kUpdateLog.back(), warning, error, "Saved library.json."});
+
+  Result run = Update();
+  EXPECT_EQ(run.code, 1);
+  EXPECT_EQ(LinesOf(run.out), expected);
+  EXPECT_EQ(run.err, "");
+  // What the run did reached the file, errors or not.
+  EXPECT_EQ(Shown("Fine"), Lines{});
+  EXPECT_EQ(Shown("Catalog").size(), 2u);
+
+  Result quiet = Update({"--quiet"});
+  EXPECT_EQ(quiet.code, 1);
+  EXPECT_EQ(LinesOf(quiet.out), (Lines{warning, error}));
+}
+
+TEST_F(CliTest, DeletionPolicies) {
+  struct Case {
+    std::vector<std::string> options;
+    std::string answers;
+    Lines deleted;  // by the report
+    int questions;
+    bool borrower_navigable;
+  };
+  const std::string original = Model();
+  for (const Case& c : std::vector<Case>{
+           {{}, "", {"Fine", "pages", "reservations"}, 0, false},
+           {{"--delete", "all"},
+            "",
+            {"Fine", "pages", "reservations"},
+            0,
+            false},
+           {{"--delete", "none"}, "", {}, 0, true},
+           // Fine, pages, reservations and borrower are asked in turn; an
+           // answer that is none of the four asks again.
+           {{"--delete", "ask"},
+            "y\nmaybe\nn\nyes\nNO\n",
+            {"Fine", "reservations"},
+            5,
+            true},
+           {{"--delete", "ask"}, "n\na\n", {"pages", "reservations"}, 2, false},
+           {{"--delete", "ask"}, "Y\nN\n", {"Fine"}, 2, true},
+           {{"--delete", "ask"}, "", {}, 1, true},
+       }) {
+    SetModel(original);
+    std::vector<std::string> options = c.options;
+    options.insert(options.end(), {"--report", "report.json"});
+    Result run = Update(options, c.answers);
+    std::string label = ::testing::PrintToString(c.options) + c.answers;
+    EXPECT_EQ(run.code, 0) << label << run.err;
+    nlohmann::json report =
+        nlohmann::json::parse(ReadText(directory_ / "report.json"));
+    Lines deleted;
+    for (const auto& element : report["deleted"]) {
+      deleted.push_back(element["name"]);
+    }
+    EXPECT_EQ(deleted, c.deleted) << label;
+    int questions = 0;
+    for (size_t at = 0; (at = run.err.find("? [y]es", at)) != std::string::npos;
+         ++at) {
+      ++questions;
+    }
+    EXPECT_EQ(questions, c.questions) << label << run.err;
+    // The saved file holds what the report says.
+    for (const std::string& name : {"Fine", "pages", "reservations"}) {
+      bool gone =
+          std::find(deleted.begin(), deleted.end(), name) != deleted.end();
+      EXPECT_EQ(Shown(" " + name).empty(), gone) << label << name;
+    }
+    EXPECT_EQ(Shown("role borrower")[0].ends_with("not navigable)"),
+              !c.borrower_navigable)
+        << label;
+  }
+  SetModel(original);
+  Result asked = Update({"--delete", "ask"}, "y\nN\n");
+  EXPECT_EQ(asked.err,
+            "Delete Class \"Fine\" of Lending? [y]es, [n]o, [a]ll, [N]one: "
+            "Delete Attribute \"pages\" of Book? [y]es, [n]o, [a]ll, [N]one: ");
+}
+
+TEST_F(CliTest, DryRunAndCheckNeverWrite) {
+  // The run asks the add-in about a backup, and the add-in wants the model
+  // saved first: still nothing may be written.
+  EditModel("\"version\": 1,", "\"askForBackup\": true,");
+  WriteText(directory_ / "registry.reg",
+            ReadText(directory_ / "registry.reg") +
+                "\n[HKEY_LOCAL_MACHINE\\SOFTWARE\\Quenta Software\\Orel\\"
+                "AddIns\\VC++]\n\"ShouldBackupModel\"=dword:00000001\n");
+  const std::string original = Model();
+  Result dry = Update({"--dry-run"});
+  EXPECT_EQ(dry.code, 0) << dry.err;
+  EXPECT_EQ(LinesOf(dry.out).back(), "Dry run: library.json was not saved.");
+  EXPECT_EQ(Model(), original);
+
+  Result before = Update({"--check"});
+  EXPECT_EQ(before.code, 3) << before.err;
+  EXPECT_EQ(LinesOf(before.out).back(),
+            "library.json is out of date with its code.");
+  EXPECT_EQ(Model(), original);
+  EXPECT_EQ(Update({"--check", "--delete", "none", "--quiet"}).code, 3);
+
+  ASSERT_EQ(Update().code, 0);
+  const std::string updated = Model();
+  EXPECT_NE(updated, original);
+  Result after = Update({"--check"});
+  EXPECT_EQ(after.code, 0) << after.err;
+  EXPECT_EQ(LinesOf(after.out).back(),
+            "library.json is in sync with its code.");
+  Result again = Update();
+  EXPECT_EQ(LinesOf(again.out).back(),
+            "No changes: library.json was left as it was.");
+  EXPECT_EQ(Model(), updated);
+}
+
+TEST_F(CliTest, ReportHoldsTheFourCollectionsAndTheDeletedElements) {
+  ASSERT_EQ(Update({"--quiet", "--report", "report.json"}).code, 0);
+  nlohmann::json expected = nlohmann::json::parse(R"({
+    "errors": [], "warnings": [],
+    "summaries": ["Components updated:", "Lending", "Lending: updated",
+                  "The update finished with 0 error(s) and 0 warning(s)."],
+    "deleted": [
+      {"kind": "Class", "owner": "Lending", "name": "Fine", "id": "{K-FINE}"},
+      {"kind": "Attribute", "owner": "Book", "name": "pages",
+       "id": "{A-PAGES}"},
+      {"kind": "Role", "owner": "Member", "name": "reservations",
+       "id": "{R-RESERVATIONS}"}]})");
+  expected["logs"] = kUpdateLog;
+  EXPECT_EQ(nlohmann::json::parse(ReadText(directory_ / "report.json")),
+            expected);
+}
+
+// A run killed while it updates leaves the model file as it was: nothing is
+// written before the run has finished, and the save replaces the file whole.
+TEST_F(CliTest, KilledRunLeavesTheModelIntact) {
+  nlohmann::json attributes = nlohmann::json::parse(
+      R"([{"name": "a", "type": "int"}, {"name": "b"}, {"name": "c"}])");
+  nlohmann::json code = nlohmann::json::parse(
+      R"({"format": "kelqln-code-description", "version": 1,
+          "components": [{"name": "big.h", "classes": []}]})");
+  for (int i = 0; i < 3000; ++i) {
+    code["components"][0]["classes"].push_back(
+        {{"name", "C" + std::to_string(i)}, {"attributes", attributes}});
+  }
+  WriteText(directory_ / "lending.json", code.dump());
+  const std::string original = Model();
+  ProgramRun run(directory_,
+                 {"update", "library.json", "--registry", "registry.reg"});
+  ASSERT_TRUE(run.AwaitFirstLine(std::chrono::seconds(60)));
+  run.Kill();
+  if (run.ExitCode() == -1) {
+    EXPECT_EQ(Model(), original);
+  } else {
+    // The run was quicker than the kill: then the file is a whole model.
+    EXPECT_EQ(Run({"show", "library.json"}).code, 0);
   }
 }
 
