@@ -10,18 +10,12 @@
 #include "automation/collection.h"
 #include "automation/dictionary.h"
 #include "automation/error.h"
+#include "tests/support/error_of.h"
 
 namespace automation {
 namespace {
 
-int ErrorOf(const std::function<void()>& f) {
-  try {
-    f();
-  } catch (const Error& error) {
-    return error.Number();
-  }
-  return 0;
-}
+using testing_support::ErrorOf;
 
 std::string Listing(const BasicCollection<std::string>& c) {
   std::string text;

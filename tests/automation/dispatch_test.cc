@@ -4,6 +4,7 @@
 
 #include "automation/call.h"
 #include "automation/error.h"
+#include "tests/support/error_of.h"
 #include "automation/member_table.h"
 
 namespace automation {
@@ -47,14 +48,7 @@ class Counter : public DispatchImpl<Counter> {
   int32_t value = 0;
 };
 
-int ErrorOf(const std::function<void()>& f) {
-  try {
-    f();
-  } catch (const Error& error) {
-    return error.Number();
-  }
-  return 0;
-}
+using testing_support::ErrorOf;
 
 TEST(DispatchTest, MembersAnswerByNumberAndByNameIgnoringCase) {
   auto counter = std::make_shared<Counter>();

@@ -5,19 +5,13 @@
 #include "automation/call.h"
 #include "automation/class_registry.h"
 #include "automation/error.h"
+#include "tests/support/error_of.h"
 #include "automation/server_module.h"
 
 namespace automation {
 namespace {
 
-int ErrorOf(const std::function<void()>& f) {
-  try {
-    f();
-  } catch (const Error& error) {
-    return error.Number();
-  }
-  return 0;
-}
+using testing_support::ErrorOf;
 
 TEST(ClassRegistryTest, CreatesByEitherNameIgnoringCase) {
   int created = 0;

@@ -9,18 +9,12 @@
 
 #include "automation/collection.h"
 #include "automation/error.h"
+#include "tests/support/error_of.h"
 
 namespace automation {
 namespace {
 
-int ErrorOf(const std::function<void()>& f) {
-  try {
-    f();
-  } catch (const Error& error) {
-    return error.Number();
-  }
-  return 0;
-}
+using testing_support::ErrorOf;
 
 TEST(VariantTest, BooleanIsSixteenBitsAllSet) {
   Variant yes(true);

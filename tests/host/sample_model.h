@@ -8,6 +8,7 @@
 #include <string>
 
 #include "automation/error.h"
+#include "tests/support/error_of.h"
 #include "host/modeltool/application.h"
 #include "host/modeltool/association.h"
 #include "host/modeltool/attribute.h"
@@ -84,16 +85,7 @@ struct SampleModel {
 
 // The error number a call raises, 0 when it raises none; `description`
 // receives the error's text.
-inline int ErrorOf(const std::function<void()>& call,
-                   std::string* description = nullptr) {
-  try {
-    call();
-  } catch (const automation::Error& error) {
-    if (description) *description = error.Description();
-    return error.Number();
-  }
-  return 0;
-}
+using testing_support::ErrorOf;
 
 }  // namespace host::modeltool
 

@@ -35,14 +35,5 @@ TEST(IconToPictureTest, ExclamationPictureHoldsTheStandardIcon) {
   EXPECT_EQ(platform::LoadStandardIcon(1), 0);
 }
 
-TEST(MinWindowSizeTest, ZeroUntilSetThenKept) {
-  EXPECT_EQ(GetMinWindowWidth(), 0);
-  EXPECT_EQ(GetMinWindowHeight(), 0);
-  SetMinWindowSize(640, 480);
-  EXPECT_EQ(GetMinWindowWidth(), 640);
-  EXPECT_EQ(GetMinWindowHeight(), 480);
-  SetMinWindowSize(0, 0);
-}
-
 }  // namespace
 }  // namespace kelqln

@@ -14,7 +14,7 @@
 #include "automation/case_folding.h"
 #include "automation/dispatch.h"
 
-namespace kelqln::testing {
+namespace testing_support {
 
 class RecordingObject : public automation::Dispatch {
  public:
@@ -68,6 +68,6 @@ class RecordingObject : public automation::Dispatch {
   mutable std::unordered_map<std::string, automation::DispId> names_;
 };
 
-}  // namespace kelqln::testing
+}  // namespace testing_support
 
 #endif  // KELQLN_TESTS_SUPPORT_RECORDING_OBJECT_H_
