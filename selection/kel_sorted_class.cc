@@ -3,13 +3,10 @@
 #include <string>
 #include <utility>
 
-#include "automation/call.h"
 #include "automation/error.h"
-#include "external/orel.h"
+#include "selection/model_reads.h"
 
 namespace kelqln {
-
-namespace orel = external::orel;
 
 kelSortedClass::kelSortedClass()
     : members_(std::make_shared<ObjectCollection>()) {}
@@ -20,8 +17,7 @@ void kelSortedClass::SetMembers(std::shared_ptr<ObjectCollection> value) {
 
 bool kelSortedClass::AddMember(const automation::Object& element) {
   try {
-    std::string id =
-        automation::CStr(automation::Get(element, orel::element::kUniqueId));
+    std::string id = UniqueIdOf(element);
     members_->Add(element, std::move(id));
     return true;
   } catch (const automation::Error&) {
@@ -31,8 +27,7 @@ bool kelSortedClass::AddMember(const automation::Object& element) {
 
 bool kelSortedClass::RemoveMember(const automation::Object& element) {
   try {
-    std::string id =
-        automation::CStr(automation::Get(element, orel::element::kUniqueId));
+    std::string id = UniqueIdOf(element);
     if (!members_->Contains(id)) return false;
     members_->Remove(id);
     return true;

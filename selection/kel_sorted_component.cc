@@ -1,21 +1,11 @@
 #include "selection/kel_sorted_component.h"
 
-#include "automation/call.h"
 #include "automation/error.h"
-#include "external/orel.h"
 #include "selection/identity_changes.h"
 #include "selection/kel_sorted_class.h"
+#include "selection/model_reads.h"
 
 namespace kelqln {
-namespace {
-
-namespace orel = external::orel;
-
-std::string UniqueIdOf(const automation::Object& element) {
-  return automation::CStr(automation::Get(element, orel::element::kUniqueId));
-}
-
-}  // namespace
 
 kelSortedComponent::kelSortedComponent() : kelSortedComponent(nullptr) {}
 

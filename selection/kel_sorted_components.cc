@@ -13,6 +13,7 @@
 #include "selection/identity_changes.h"
 #include "selection/kel_sorted_class.h"
 #include "selection/kel_sorted_component.h"
+#include "selection/model_reads.h"
 #include "shared/string_utilities.h"
 
 namespace kelqln {
@@ -44,37 +45,11 @@ void Guarded(Step&& step) {
   }
 }
 
-std::string UniqueIdOf(const Object& element) {
-  return CStr(Get(element, orel::element::kUniqueId));
-}
-std::string NameOf(const Object& element) {
-  return CStr(Get(element, orel::element::kName));
-}
-std::string StereotypeOf(const Object& element) {
-  return CStr(Get(element, orel::element::kStereotype));
-}
-std::string LanguageOf(const Object& component) {
-  return CStr(Get(component, orel::component::kLanguage));
-}
-Object ApplicationOf(const Object& element) {
-  return automation::GetObject(element, orel::element::kApplication);
-}
-
-// The elements of a collection of the modelling tool, in order, counted
-// once before the walk.
-std::vector<Object> ModelItems(const Object& collection) {
-  int32_t count = automation::CLng(Get(collection, orel::collection::kCount));
-  std::vector<Object> items;
-  items.reserve(static_cast<size_t>(std::max(count, 0)));
-  for (int32_t i = 1; i <= count; ++i) {
-    items.push_back(
-        CObj(automation::Call(collection, orel::collection::kGetAt, i)));
-  }
-  return items;
-}
-// The elements of the collection that member `id` of `owner` gives.
-std::vector<Object> ItemsOf(const Object& owner, automation::DispId id) {
-  return ModelItems(CObj(automation::Call(owner, id)));
+// The language a component is filed under: its own, or "Unassigned" for
+// none (and for no component: the pseudo-component's).
+std::string FilingLanguageOf(const Object& component) {
+  std::string language = component ? LanguageOf(component) : "";
+  return language.empty() ? kelSortedComponents::kUnassigned : language;
 }
 
 bool IsInterfaceOrCoclass(const Object& cls) {
@@ -169,13 +144,7 @@ kelSortedComponents::kelSortedComponents()
     : indexed_at_(IdentityChangeCount()) {}
 
 NameCollection kelSortedComponents::GetIncludedLanguages() const {
-  NameCollection names;
-  for (const Language& language : languages_) {
-    if (EqualsIgnoreCase(language.name, kUnassigned)) continue;
-    if (language.components->Empty()) continue;
-    names.Add(language.name, language.name);
-  }
-  return names;
+  return IncludedLanguages(languages_, kUnassigned);
 }
 
 std::shared_ptr<const SortedComponentCollection>
@@ -193,8 +162,7 @@ std::shared_ptr<const SortedComponentCollection>
 kelSortedComponents::GetComponents(std::string_view language) const {
   const Language* found =
       languages_.Find(language.empty() ? kUnassigned : language);
-  return found ? found->components
-               : std::make_shared<SortedComponentCollection>();
+  return found ? found->entries : std::make_shared<SortedComponentCollection>();
 }
 
 std::shared_ptr<kelSortedComponent> kelSortedComponents::AddComponent(
@@ -236,11 +204,9 @@ std::shared_ptr<kelSortedComponent> kelSortedComponents::AddComponentNoClasses(
     const Object& component) {
   if (!component) return nullptr;
   try {
-    std::string language = LanguageOf(component);
-    if (language.empty()) language = kUnassigned;
-    std::string key = UniqueIdOf(component);
-    return File(GetLanguageComponents(language, true), component, language,
-                key);
+    std::string language = FilingLanguageOf(component);
+    return File(LanguageComponents(language), component, language,
+                UniqueIdOf(component));
   } catch (const automation::Error&) {
     return nullptr;  // filed already, or no readable component
   }
@@ -380,7 +346,7 @@ std::shared_ptr<kelSortedClass> kelSortedComponents::FindClassInComponent(
 
 Object kelSortedComponents::FindClass(std::string_view aClassUniqueID) const {
   for (const Language& language : languages_) {
-    for (const auto& entry : *language.components) {
+    for (const auto& entry : *language.entries) {
       if (auto* found = entry->Classes()->Find(aClassUniqueID)) {
         return (*found)->Class();
       }
@@ -407,7 +373,7 @@ void kelSortedComponents::RemoveAllUnassignedItems() {
 ObjectCollection kelSortedComponents::GetAllOrelComponents() const {
   ObjectCollection components;
   for (const Language& language : languages_) {
-    for (const auto& entry : *language.components) {
+    for (const auto& entry : *language.entries) {
       if (!entry->Component()) continue;
       std::string id = UniqueIdOf(entry->Component());
       if (!components.Contains(id)) components.Add(entry->Component(), id);
@@ -419,7 +385,7 @@ ObjectCollection kelSortedComponents::GetAllOrelComponents() const {
 std::shared_ptr<kelSortedComponents> kelSortedComponents::Clone() const {
   auto copy = std::make_shared<kelSortedComponents>();
   for (const Language& language : languages_) {
-    for (const auto& entry : *language.components) {
+    for (const auto& entry : *language.entries) {
       copy->AddComponentNoClasses(entry->Component());
       for (const Object& cls : entry->GetOrelClasses()) copy->AddClass(cls);
     }
@@ -464,25 +430,18 @@ void kelSortedComponents::RemoveAllUnmodifiableUnassignedClasses() {
 }
 
 std::shared_ptr<SortedComponentCollection>
-kelSortedComponents::GetLanguageComponents(std::string_view language,
-                                           bool create) {
-  std::string name = language.empty() ? kUnassigned : std::string(language);
-  if (Language* found = languages_.Find(name)) return found->components;
+kelSortedComponents::LanguageComponents(const std::string& language) {
+  if (Language* found = languages_.Find(language)) return found->entries;
   auto components = std::make_shared<SortedComponentCollection>();
-  if (create) languages_.Add(Language{name, components}, name);
+  languages_.Add(Language{language, components}, language);
   return components;
 }
 
 std::shared_ptr<kelSortedComponent> kelSortedComponents::GetSortedComponent(
     const Object& component) {
-  std::string language = kUnassigned;
-  std::string key = kUnassigned;
-  if (component) {
-    language = LanguageOf(component);
-    if (language.empty()) language = kUnassigned;
-    key = UniqueIdOf(component);
-  }
-  auto components = GetLanguageComponents(language, true);
+  std::string language = FilingLanguageOf(component);
+  std::string key = component ? UniqueIdOf(component) : kUnassigned;
+  auto components = LanguageComponents(language);
   if (auto* found = components->Find(key)) return *found;
   // The language stays registered when the component is refused; the
   // listings skip empty languages.
@@ -504,7 +463,7 @@ std::shared_ptr<kelSortedComponent> kelSortedComponents::FindPseudoComponent()
     const {
   const Language* language = languages_.Find(kUnassigned);
   if (!language) return nullptr;
-  auto* found = language->components->Find(kUnassigned);
+  auto* found = language->entries->Find(kUnassigned);
   return found && !(*found)->Component() ? *found : nullptr;
 }
 
@@ -709,7 +668,7 @@ void kelSortedComponents::RebuildIndex() {
   by_unique_id_.clear();
   for (int32_t l = 1; l <= languages_.Count(); ++l) {
     const Language& language = languages_.Item(l);
-    const SortedComponentCollection& components = *language.components;
+    const SortedComponentCollection& components = *language.entries;
     for (int32_t i = 1; i <= components.Count(); ++i) {
       const auto& entry = components.Item(i);
       if (!entry->Component()) continue;
@@ -731,24 +690,16 @@ const kelSortedComponents::Placement* kelSortedComponents::FindPlacement(
     const Object& component = placement.entry->Component();
     if (component && UniqueIdOf(component) == id) matches.push_back(&placement);
   }
-  if (matches.size() <= 1) return matches.empty() ? nullptr : matches.front();
   // The same identifier in several languages: the first in list order.
-  for (const Language& language : languages_) {
-    for (const auto& entry : *language.components) {
-      for (const Placement* match : matches) {
-        if (match->entry == entry) return match;
-      }
-    }
-  }
-  return nullptr;
+  return FirstInListOrder(languages_, matches);
 }
 
 void kelSortedComponents::Unfile(std::string_view id,
                                  const Placement& placement) {
   Placement removed = placement;  // `placement` lives in the index
   Language* language = languages_.Find(removed.language);
-  language->components->Remove(removed.key);
-  if (language->components->Empty()) languages_.Remove(removed.language);
+  language->entries->Remove(removed.key);
+  if (language->entries->Empty()) languages_.Remove(removed.language);
   std::vector<Placement>& bucket = by_unique_id_[std::string(id)];
   std::erase_if(bucket, [&](const Placement& candidate) {
     return candidate.entry == removed.entry;

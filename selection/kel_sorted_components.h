@@ -41,6 +41,7 @@
 
 #include "automation/collection.h"
 #include "automation/variant.h"
+#include "selection/language_table.h"
 #include "selection/selection_collections.h"
 
 namespace kelqln {
@@ -191,23 +192,16 @@ class kelSortedComponents {
   void RemoveAllUnmodifiableUnassignedClasses();
 
  private:
-  struct Language {
-    std::string name;
-    std::shared_ptr<SortedComponentCollection> components;
-  };
-  // Where an entry is filed: its language's key and its own key there.
-  struct Placement {
-    std::shared_ptr<kelSortedComponent> entry;
-    std::string language;
-    std::string key;
-  };
+  using Language = LanguageEntries<kelSortedComponent>;
+  using Placement = kelqln::Placement<kelSortedComponent>;
   struct MidlComponent {
     automation::Object component;
     bool created = false;
   };
 
-  std::shared_ptr<SortedComponentCollection> GetLanguageComponents(
-      std::string_view language, bool create);
+  // The collection of `language`, registered when new.
+  std::shared_ptr<SortedComponentCollection> LanguageComponents(
+      const std::string& language);
   std::shared_ptr<kelSortedComponent> GetSortedComponent(
       const automation::Object& component);
   // Files a new entry for `component` in `components`, the collection of
@@ -244,7 +238,7 @@ class kelSortedComponents {
   bool include_all_components_ = false;
   ObjectCollection generators_;
   std::shared_ptr<automation::Collection> excluded_stereotypes_;
-  automation::BasicCollection<Language> languages_;
+  LanguageTable<kelSortedComponent> languages_;
   std::unordered_map<std::string, std::vector<Placement>> by_unique_id_;
   std::optional<uint64_t> indexed_at_;
 };

@@ -4,9 +4,11 @@
 
 #include <gtest/gtest.h>
 
+#include <cctype>
 #include <string>
 #include <vector>
 
+#include "host/modeltool/operation.h"
 #include "selection/kel_sorted_class.h"
 #include "selection/kel_sorted_component.h"
 #include "selection_test_support.h"
@@ -77,7 +79,6 @@ TEST_F(KelSortedComponentsTest, FilesByLanguageThenComponentInOrderMet) {
   Strings names;
   for (const Object& component : all) names.push_back(NameOf(component));
   EXPECT_EQ(names, (Strings{"Gui", "Tools", "Engine", "Loose", "Late"}));
-  EXPECT_EQ(all.Item(late->UniqueId()), Object(late));
 
   // Found wherever they are filed, the pseudo-component included.
   for (const auto& component : {gui, engine, loose, tools, late}) {
@@ -252,11 +253,6 @@ TEST_F(KelSortedComponentsTest, LookUpsCompareIdentifiersExactly) {
   entry->SetComponent(stranger);
   EXPECT_EQ(selection.FindComponent(stranger), entry);
   EXPECT_EQ(selection.FindComponent(other), nullptr);
-
-  // An identifier changed in the model no longer finds the entry.
-  std::string old_id = stranger->UniqueId();
-  stranger->SetUniqueId("NEW");
-  EXPECT_EQ(selection.FindComponentFromUniqueID(old_id), nullptr);
 }
 
 TEST_F(KelSortedComponentsTest, CloneRefilesFromTheModel) {
@@ -300,14 +296,8 @@ TEST_F(KelSortedComponentsTest, SortsTheSelectionInItsOrder) {
             (Strings{"Gui()", "Inner()", "Tools(Picked)"}));
   EXPECT_EQ(Filed(selection, ""), (Strings{"<Unassigned>(Loose)"}));
 
-  kelSortedComponents everything;
-  everything.SortSelectionAllComponents(model_);
-  EXPECT_EQ(Filed(everything, "VB"),
-            (Strings{"Gui()", "Inner()", "Tools(Picked)"}));
-
   // The modelling tool's failures reach the caller.
   EXPECT_THROW(selection.SortSelection(gui), automation::Error);
-  EXPECT_THROW(selection.SortComponents(nullptr, nullptr), automation::Error);
 }
 
 TEST_F(KelSortedComponentsTest, UnmodifiableUnassignedClassesGo) {
@@ -319,6 +309,57 @@ TEST_F(KelSortedComponentsTest, UnmodifiableUnassignedClassesGo) {
   locked->SetModifiable(false);
   selection.RemoveAllUnmodifiableUnassignedClasses();
   EXPECT_EQ(Filed(selection, ""), (Strings{"<Unassigned>(Free)"}));
+}
+
+TEST_F(KelSortedComponentsTest, MembersComeAndGoByUniqueIdentifier) {
+  auto gui = NewComponent("Gui", "VB");
+  auto form = NewClass("Form", {gui});
+  auto view = NewClass("View", {gui});
+  auto x = form->NewAttribute("x");
+  auto draw = form->NewOperation("Draw");
+  kelSortedComponents selection;
+  auto entry = selection.AddComponent(gui);
+  ASSERT_NE(entry, nullptr);
+
+  struct Step {
+    const char* what;
+    bool add;
+    Object member;
+    Object cls;
+    bool result;
+    int form_members;  // -1: Form has no entry
+  };
+  const Step steps[] = {
+      {"add x", true, x, form, true, 1},
+      {"add x again", true, x, form, false, 1},
+      {"add Nothing", true, nullptr, form, false, 1},
+      {"add draw", true, draw, form, true, 2},
+      {"class without entry", true, x, NewClass("Other"), false, 2},
+      {"remove absent", false, NewClass("Stray"), form, false, 2},
+      {"remove x", false, x, form, true, 1},
+      {"remove the last", false, draw, form, true, -1},
+      {"entry gone", false, draw, form, false, -1},
+  };
+  for (const Step& step : steps) {
+    bool result = step.add
+                      ? entry->AddMemberInClass(step.member, step.cls)
+                      : entry->RemoveMemberFromClass(step.member, step.cls);
+    EXPECT_EQ(result, step.result) << step.what;
+    auto* found = entry->Classes()->Find(form->UniqueId());
+    EXPECT_EQ(found ? (*found)->Members()->Count() : -1, step.form_members)
+        << step.what;
+  }
+
+  // The first class is gone; the other keeps its place.
+  ObjectCollection classes = entry->GetOrelClasses();
+  ASSERT_EQ(classes.Count(), 1);
+  EXPECT_EQ(classes.Item(view->UniqueId()), Object(view));
+  std::string key = view->UniqueId();
+  for (char& c : key) c = static_cast<char>(std::tolower(c));
+  EXPECT_TRUE(entry->IncludesClass(key));
+  entry->RemoveClass("no such key");
+  entry->RemoveClass(key);
+  EXPECT_FALSE(entry->IncludesClass(view->UniqueId()));
 }
 
 }  // namespace

@@ -53,50 +53,41 @@ class MidlCompanionTest : public SelectionTest {
 };
 
 TEST_F(MidlCompanionTest, IsMadeBesideTheComponentWithItsInterfaceFile) {
+  const std::string dir = directory_.string() + "/";
   struct Case {
     std::vector<std::string> files;
-    std::string file_name;  // "" : the four file properties are cleared
+    std::string file_properties;  // after the copied and the Kind property
   };
   const std::vector<Case> cases = {
-      {{"shapes0.idl", "shapes0.odl"}, "shapes0.idl"},
-      {{"shapes1.odl"}, "shapes1.odl"},
-      {{}, ""},
+      {{"s0.idl", "s0.odl"}, "VC++:FileName=" + dir + "s0.idl"},
+      {{"s1.odl"}, "VC++:FileName=" + dir + "s1.odl"},
+      {{},
+       "VC++:ProjectFile= VC++:WorkspaceFile= VC++:ProjectName= "
+       "VC++:FileName="},
   };
   for (size_t i = 0; i < cases.size(); ++i) {
-    const Case& c = cases[i];
     std::string name = "Shapes" + std::to_string(i);
-    for (const auto& file : c.files) Touch(file);
-    Server("VC++").project_file =
-        " " + (directory_ / ("shapes" + std::to_string(i) + ".dsp")).string();
+    for (const auto& file : cases[i].files) Touch(file);
+    Server("VC++").project_file = " " + dir + "s" + std::to_string(i) + ".dsp";
     auto component = NewVcComponent(name);
-
     kelSortedComponents selection;
     ASSERT_NE(selection.AddComponent(component), nullptr);
 
     ASSERT_EQ(package_->Components().size(), 2u) << name;
     auto midl = package_->Components()[1];
-    EXPECT_EQ(midl->Name(), name + ".idl");
-    EXPECT_EQ(midl->Language(), "VC++");
-    EXPECT_EQ(midl->Stereotype(), "MIDL");
-    EXPECT_EQ(midl->ToolPropertyValue("VC++", "Custom"), "yes");
-    EXPECT_EQ(midl->ToolPropertyValue("VC++", "Kind"), "MIDL");
-    if (c.file_name.empty()) {
-      for (const char* property :
-           {"FileName", "ProjectFile", "WorkspaceFile", "ProjectName"}) {
-        auto found = midl->FindToolProperty("VC++", property);
-        ASSERT_NE(found, nullptr) << property;
-        EXPECT_EQ(found->Value(), "") << property;
-      }
-    } else {
-      EXPECT_EQ(midl->ToolPropertyValue("VC++", "FileName"),
-                (directory_ / c.file_name).string());
+    std::string properties;
+    for (const auto& property : midl->ToolProperties()) {
+      properties += property->Tool() + ":" + property->Name() + "=" +
+                    property->Value() + " ";
     }
+    EXPECT_EQ(properties, "VC++:Custom=yes VC++:Kind=MIDL " +
+                              cases[i].file_properties + " ");
+    EXPECT_EQ(midl->Name() + " " + midl->Language() + " " + midl->Stereotype(),
+              name + ".idl VC++ MIDL");
     EXPECT_EQ(ComponentNames(classes_[0]), (Strings{name, name + ".idl"}));
     EXPECT_EQ(ComponentNames(classes_[1]), (Strings{name, name + ".idl"}));
     EXPECT_EQ(ComponentNames(classes_[2]), (Strings{name}));
-    auto filed = selection.FindComponent(midl);
-    ASSERT_NE(filed, nullptr);
-    EXPECT_EQ(filed->Classes()->Count(), 2);
+    EXPECT_EQ(selection.FindComponent(midl)->Classes()->Count(), 2);
     EXPECT_EQ(LogMessages().back(),
               "AddClass: Assign to MIDL " + name + ".idl\r\n\tCreate=True");
   }

@@ -40,12 +40,10 @@ using automation::CallKind;
 using automation::Object;
 using automation::Variant;
 
-// A statement generator whose inclusion query answers `rule`; by default
-// everything is included except elements named "Refused...".
+// A statement generator that includes every element except those named
+// "Refused...", and keeps the arguments of each query.
 class TestGenerator : public automation::DispatchImpl<TestGenerator> {
  public:
-  using Rule = std::function<bool(const Object& component, const Object& item)>;
-
   static const automation::MemberTable<TestGenerator>& Members() {
     static const automation::MemberTable<TestGenerator> table(
         "TestGenerator",
@@ -53,17 +51,14 @@ class TestGenerator : public automation::DispatchImpl<TestGenerator> {
           external::code_view::statement_generator::kProcessName,
           CallKind::kMethod, [](TestGenerator& self, Args& args) {
             self.queries.push_back(args);
-            bool answer = self.rule(automation::CObj(args.at(0)),
-                                    automation::CObj(args.at(1)));
-            args.at(4) = Variant(answer);
-            return Variant(answer);
+            return Variant(
+                !automation::CStr(
+                     automation::Get(automation::CObj(args.at(1)), 100))
+                     .starts_with("Refused"));
           }}});
     return table;
   }
 
-  Rule rule = [](const Object&, const Object& item) {
-    return !automation::CStr(automation::Get(item, 100)).starts_with("Refused");
-  };
   std::vector<Args> queries;
 };
 
@@ -101,7 +96,7 @@ class TestLanguageServer : public automation::DispatchImpl<TestLanguageServer> {
   int generator_reads = 0;
   std::string project_file;
   std::function<Object(const Object& component, const Object& reporter)>
-      code_view_project = [](const Object&, const Object&) { return nullptr; };
+      code_view_project;
 };
 
 inline constexpr char kAddInsKey[] = "SOFTWARE\\Quenta Software\\Orel\\AddIns";
