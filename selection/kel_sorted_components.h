@@ -16,10 +16,12 @@
 // "<component>.idl", which is reused when a usable one exists in the
 // component's package and otherwise created there (see AddComponent).
 //
-// Failures come back as results (Nothing, False, an empty collection), and
-// AddClass goes on past failing steps. The errors that reach the caller are
-// RemoveComponent without a component and the modelling tool's failures in
-// the Sort/GetAll operations, in AddComponent and in ShouldAddClass.
+// What is not there comes back as a result (Nothing, False, an empty
+// collection); AddComponentNoClasses answers Nothing on any failure. AddClass
+// and the MIDL companion's steps go on past the modelling tool's failures,
+// and a failing add-in has no statement generator. Every other failure of
+// the modelling tool reaches the caller as automation::Error, and so does
+// RemoveComponent without a component.
 //
 // Look-ups by component take constant time on average: the selection keeps
 // an index of its entries by the exact unique identifier of their model

@@ -189,12 +189,12 @@ void kelSortedCVProjects::File(const std::shared_ptr<kelSortedCVProject>& entry,
 void kelSortedCVProjects::Unfile(const Placement& placement) {
   Placement removed = placement;  // `placement` may live in the index
   Language* language = languages_.Find(removed.language);
-  int32_t position = 0;
+  int32_t position = 1;
   for (const auto& entry : *language->entries) {
-    ++position;
     if (entry == removed.entry) break;
+    ++position;
   }
-  language->entries->Remove(position);
+  language->entries->Remove(position);  // the index knows it is there
   if (language->entries->Empty()) languages_.Remove(removed.language);
   Forget(by_project_, removed.entry->Project().get(), removed.entry);
   if (removed.entry->OrelComponent()) {
