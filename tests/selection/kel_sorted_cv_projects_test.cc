@@ -28,10 +28,14 @@ using testing_support::ErrorOf;
 using Strings = std::vector<std::string>;
 
 // A code-view project, component or workspace: members by number, each a
-// value to read and, for the identifier, to write.
+// value to read and, for the identifier, to write. A component refers to
+// its project without keeping it, as the project keeps its components.
 class CodeViewObject : public automation::Dispatch {
  public:
   Variant Invoke(automation::DispId id, CallKind kind, Args& args) override {
+    if (id == cv::component::kProject && !project.expired()) {
+      return Variant(Object(project.lock()));
+    }
     if (kind == CallKind::kPropertyPut) {
       values[id] = automation::PutValue(args);
       return Variant();
@@ -47,6 +51,7 @@ class CodeViewObject : public automation::Dispatch {
   std::string TypeName() const override { return "CodeViewObject"; }
 
   std::map<automation::DispId, Variant> values;
+  std::weak_ptr<automation::Dispatch> project;
 };
 
 std::shared_ptr<CodeViewObject> NewProject(const std::string& name,
@@ -64,8 +69,8 @@ std::shared_ptr<CodeViewObject> NewProject(const std::string& name,
 std::shared_ptr<CodeViewObject> NewCodeComponent(
     const std::shared_ptr<CodeViewObject>& project, const std::string& name) {
   auto component = std::make_shared<CodeViewObject>();
-  component->values = {{cv::component::kProject, Variant(project)},
-                       {cv::component::kName, Variant(name)}};
+  component->values = {{cv::component::kName, Variant(name)}};
+  component->project = project;
   auto list = automation::CObj(project->values[cv::project::kComponents]);
   std::static_pointer_cast<automation::Collection>(list)->Items().Add(
       Variant(component));
