@@ -149,7 +149,8 @@ void DeleteSelectedElements(const kelSortedComponents& selection,
                             kelReporterApi& reporter, const std::string& done,
                             const std::string& failed) {
   Deleter deleter(reporter, done, failed);
-  for (const auto& component : *selection.GetComponents(language)) {
+  auto components = selection.GetComponents(language);
+  for (const auto& component : *components) {
     for (const auto& sorted_class : *component->Classes()) {
       const Object& cls = sorted_class->Class();
       if (sorted_class->Members()->Empty()) {

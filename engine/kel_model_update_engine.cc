@@ -324,7 +324,8 @@ void kelModelUpdateEngine::SynchronizeWithCallBack(
   if (!CallBack) return;
   auto list = automation::Collection::Create();
   for (const std::string& language : selection->GetIncludedLanguages()) {
-    for (const auto& sorted_component : *selection->GetComponents(language)) {
+    auto components = selection->GetComponents(language);
+    for (const auto& sorted_component : *components) {
       for (const auto& sorted_class : *sorted_component->Classes()) {
         if (sorted_class->Members()->Empty()) {
           list->Items().Add(Variant(sorted_class->Class()));

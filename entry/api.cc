@@ -381,7 +381,8 @@ void API::Teardown() {
          std::shared_ptr<kelSortedCVProjects> code_items =
              GetSelectedCodeItems();
          if (code_items) {
-           for (const auto& project : *code_items->GetProjects(kVisualCpp)) {
+           auto projects = code_items->GetProjects(kVisualCpp);
+           for (const auto& project : *projects) {
              automation::Call(project->Project(), code_view::project::kRelease,
                               shared_simplereporter::Create());
            }
