@@ -102,6 +102,23 @@ void ReportError(kelReporterApi& reporter, std::string text) {
   reporter.Error(text);
 }
 
+// The member that gives a member's owner class, by the member's kind name;
+// null for a kind that is no member of a class.
+const automation::DispId* OwnerMemberOf(const std::string& kind) {
+  static const std::pair<const char*, automation::DispId> kOwners[] = {
+      {orel::kind::kAttribute, orel::owner::kOfAttribute},
+      {orel::kind::kOperation, orel::owner::kOfOperation},
+      {orel::kind::kRole, orel::owner::kOfRole},
+      {orel::kind::kInheritRelation, orel::owner::kOfInheritRelation},
+      {orel::kind::kRealizeRelation, orel::owner::kOfRealizeRelation},
+      {orel::kind::kHasRelationship, orel::owner::kOfHasRelationship},
+  };
+  for (const auto& [name, owner] : kOwners) {
+    if (kind == name) return &owner;
+  }
+  return nullptr;
+}
+
 // The items of a collection object from outside (a code-view collection, a
 // callback's list).
 std::vector<Variant> ItemsOf(const Variant& collection) {
@@ -368,26 +385,13 @@ void kelModelUpdateEngine::SynchronizeWithCallBack(
   for (const Variant& element : confirmed) {
     Object object = automation::CObj(element);
     std::string kind = CStr(automation::Get(object, orel::element::kKindName));
-    automation::DispId owner = 0;
     if (kind == orel::kind::kClass) {
       selection->AddClassInComponent(object, component);
       continue;
-    } else if (kind == orel::kind::kAttribute) {
-      owner = orel::owner::kOfAttribute;
-    } else if (kind == orel::kind::kOperation) {
-      owner = orel::owner::kOfOperation;
-    } else if (kind == orel::kind::kRole) {
-      owner = orel::owner::kOfRole;
-    } else if (kind == orel::kind::kInheritRelation) {
-      owner = orel::owner::kOfInheritRelation;
-    } else if (kind == orel::kind::kRealizeRelation) {
-      owner = orel::owner::kOfRealizeRelation;
-    } else if (kind == orel::kind::kHasRelationship) {
-      owner = orel::owner::kOfHasRelationship;
-    } else {
-      continue;
     }
-    AddToSelection(object, automation::GetObject(object, owner), component,
+    const automation::DispId* owner = OwnerMemberOf(kind);
+    if (owner == nullptr) continue;  // no kind that can be deleted
+    AddToSelection(object, automation::GetObject(object, *owner), component,
                    *selection);
   }
 }
@@ -438,6 +442,8 @@ bool kelModelUpdateEngine::UpdateProject(
   Object cv = project->Project();
   if (!cv) {
     cv = GetCodeViewProject(run.application, language, component, reporter_);
+    // The look-up may hand back another reporter, but the run needs one.
+    if (!reporter_) throw automation::Error(automation::kObjectNotSet);
   }
   if (!cv) {
     ReportError(*reporter_, Filled(kText3631, language));
@@ -459,6 +465,7 @@ bool kelModelUpdateEngine::UpdateProject(
     try {
       automation::Call(cv, code_view::project::kRelease, reporter);
     } catch (const automation::Error&) {
+      // Under the open's guard: the project is dropped all the same.
     }
     RemoveProject(run, *project, component);
     return true;
