@@ -11,6 +11,9 @@ using automation::DispId;
 
 // The server object of a language add-in.
 namespace add_in_server {
+// Called by the modelling tool with the add-in object once it has made the
+// server, so that one server class can serve several add-ins.
+inline constexpr char kOnConnection[] = "OnConnection";  // (add-in)
 inline constexpr char kGetRteServer[] = "GetRTEServer";
 inline constexpr char kCompPropertiesApi[] = "CompPropertiesAPI";
 }  // namespace add_in_server

@@ -2,8 +2,10 @@
 
 #include <utility>
 
+#include "automation/call.h"
 #include "automation/class_registry.h"
 #include "automation/error.h"
+#include "external/code_view.h"
 #include "external/orel.h"
 
 namespace host::modeltool {
@@ -30,8 +32,28 @@ automation::Object AddIn::Server() {
         automation::kCannotCreateObject,
         "The add-in " + description_.name + " has no server object");
   }
-  server_ = automation::CreateObject(description_.server_prog_id);
+  automation::Object server =
+      automation::CreateObject(description_.server_prog_id);
+  // A server class may serve several add-ins: it learns which one from the
+  // add-in object. A server that fails to connect is not kept.
+  if (Answers(server, external::code_view::add_in_server::kOnConnection)) {
+    automation::CallByName(server,
+                           external::code_view::add_in_server::kOnConnection,
+                           automation::Object(shared_from_this()));
+  }
+  server_ = std::move(server);
   return server_;
+}
+
+bool AddIn::Answers(const automation::Object& object, std::string_view name) {
+  if (!object) return false;
+  try {
+    object->IdOfName(name);
+    return true;
+  } catch (const automation::Error& error) {
+    if (error.Number() != automation::kNoSuchMember) throw;
+    return false;
+  }
 }
 
 const SettingsStore& AddIn::RequireSettings() const {

@@ -7,6 +7,7 @@
 
 #include <memory>
 #include <string>
+#include <string_view>
 
 #include "automation/member_table.h"
 #include "host/modeltool/settings_store.h"
@@ -41,9 +42,10 @@ class AddIn : public automation::DispatchImpl<AddIn> {
   std::string RegistryKey() const;
 
   // The server object: the one set with SetServer, else the object made by
-  // automation::CreateObject(server ProgId) on first use and kept. A failed
-  // creation raises its error (and the next call tries again); an add-in
-  // without ProgId raises kCannotCreateObject.
+  // automation::CreateObject(server ProgId) on first use and kept; a server
+  // that answers "OnConnection" is first given this add-in by that call. A
+  // failed creation or connection raises its error (and the next call tries
+  // again); an add-in without ProgId raises kCannotCreateObject.
   automation::Object Server();
   void SetServer(automation::Object server) { server_ = std::move(server); }
 
@@ -56,6 +58,8 @@ class AddIn : public automation::DispatchImpl<AddIn> {
 
  private:
   const SettingsStore& RequireSettings() const;
+  // Whether `object` has a member called `name`.
+  static bool Answers(const automation::Object& object, std::string_view name);
 
   AddInDescription description_;
   automation::Object server_;

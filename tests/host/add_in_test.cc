@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <fstream>
 #include <string>
+#include <vector>
 
 #include "automation/call.h"
 #include "automation/class_registry.h"
@@ -130,6 +131,57 @@ TEST_F(AddInTest, TheServerIsMadeOnceByItsProgId) {
   auto none = NewAddIn("Y");
   EXPECT_EQ(ErrorOf([&] { automation::Get(none, orel::add_in::kServer); }),
             automation::kCannotCreateObject);
+}
+
+// A server that records the add-ins it is connected to.
+class ConnectingServer : public automation::DispatchImpl<ConnectingServer> {
+ public:
+  static const automation::MemberTable<ConnectingServer>& Members() {
+    static const automation::MemberTable<ConnectingServer> table(
+        "ConnectingServer",
+        {{automation::kNamedOnly, "OnConnection", automation::CallKind::kMethod,
+          [](ConnectingServer& self, automation::Args& args) {
+            Object add_in = automation::CObj(automation::RequiredArg(args, 0));
+            if (fail_next) {
+              fail_next = false;
+              throw automation::Error(automation::kInvalidProcedureCall);
+            }
+            self.connected.push_back(
+                CStr(automation::Get(add_in, orel::add_in::kName)));
+            return automation::Variant();
+          }}});
+    return table;
+  }
+  static inline bool fail_next = false;
+  std::vector<std::string> connected;
+};
+
+TEST_F(AddInTest, AServerLearnsItsAddInFromOnConnection) {
+  automation::RegisterClass("kelqln.ConnectingServer", "", [] {
+    return automation::Object(std::make_shared<ConnectingServer>());
+  });
+  AddInManager manager;
+  manager.Add(NewAddIn("VC++", "kelqln.ConnectingServer"));
+  manager.Add(NewAddIn("Visual Basic", "kelqln.ConnectingServer"));
+  for (const char* name : {"VC++", "Visual Basic"}) {
+    auto add_in = manager.Find(name);
+    Object server = automation::GetObject(add_in, orel::add_in::kServer);
+    automation::GetObject(add_in, orel::add_in::kServer);
+    auto connecting = std::dynamic_pointer_cast<ConnectingServer>(server);
+    ASSERT_NE(connecting, nullptr);
+    EXPECT_EQ(connecting->connected, std::vector<std::string>{name});
+  }
+
+  // A server that cannot connect is not kept: the next use tries again.
+  auto add_in = NewAddIn("C#", "kelqln.ConnectingServer");
+  ConnectingServer::fail_next = true;
+  EXPECT_EQ(ErrorOf([&] { automation::Get(add_in, orel::add_in::kServer); }),
+            automation::kInvalidProcedureCall);
+  auto server = std::dynamic_pointer_cast<ConnectingServer>(
+      automation::GetObject(add_in, orel::add_in::kServer));
+  ASSERT_NE(server, nullptr);
+  EXPECT_EQ(server->connected, std::vector<std::string>{"C#"});
+  automation::UnregisterClass("kelqln.ConnectingServer");
 }
 
 TEST_F(AddInTest, SettingsAreWrittenAndReadBack) {
