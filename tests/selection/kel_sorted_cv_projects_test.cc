@@ -1,12 +1,12 @@
 // Code-view projects filed by their model component's language, their
 // components and members told apart by identity, the binding of a project
-// to its component by unique identifier, and the entries' trace lines.
+// to its component by unique identifier, and the entries' trace lines; the
+// projects are the description add-in's.
 #include "selection/kel_sorted_cv_projects.h"
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <map>
 #include <string>
 #include <vector>
 
@@ -27,65 +27,22 @@ namespace cv = external::code_view;
 using testing_support::ErrorOf;
 using Strings = std::vector<std::string>;
 
-// A code-view project, component or workspace: members by number, each a
-// value to read and, for the identifier, to write. A component refers to
-// its project without keeping it, as the project keeps its components.
-class CodeViewObject : public automation::Dispatch {
- public:
-  Variant Invoke(automation::DispId id, CallKind kind, Args& args) override {
-    if (id == cv::component::kProject && !project.expired()) {
-      return Variant(Object(project.lock()));
-    }
-    if (kind == CallKind::kPropertyPut) {
-      values[id] = automation::PutValue(args);
-      return Variant();
-    }
-    auto found = values.find(id);
-    if (found == values.end())
-      throw automation::Error(automation::kNoSuchMember);
-    return found->second;
-  }
-  automation::DispId IdOfName(std::string_view) const override {
-    throw automation::Error(automation::kNoSuchMember);
-  }
-  std::string TypeName() const override { return "CodeViewObject"; }
-
-  std::map<automation::DispId, Variant> values;
-  std::weak_ptr<automation::Dispatch> project;
-};
-
-std::shared_ptr<CodeViewObject> NewProject(const std::string& name,
-                                           const std::string& language,
-                                           const std::string& id = "") {
-  auto project = std::make_shared<CodeViewObject>();
-  project->values = {
-      {cv::project::kLanguage, Variant(language)},
-      {cv::project::kName, Variant(name)},
-      {cv::project::kComponents, Variant(automation::Collection::Create())},
-      {cv::project::kUniqueId, Variant(id)}};
-  return project;
+// The code-view component at `position` of a project.
+Object Part(const Object& project, int32_t position) {
+  return automation::CObj(
+      automation::Call(automation::GetObject(project, cv::project::kComponents),
+                       automation::Collection::kItem, position));
 }
 
-std::shared_ptr<CodeViewObject> NewCodeComponent(
-    const std::shared_ptr<CodeViewObject>& project, const std::string& name) {
-  auto component = std::make_shared<CodeViewObject>();
-  component->values = {{cv::component::kName, Variant(name)}};
-  component->project = project;
-  auto list = automation::CObj(project->values[cv::project::kComponents]);
-  std::static_pointer_cast<automation::Collection>(list)->Items().Add(
-      Variant(component));
-  return component;
-}
-
-std::string UniqueIdOf(const Object& project) {
-  return automation::CStr(automation::Get(project, cv::project::kUniqueId));
+std::string NameOf(const Object& code_view_object) {
+  return automation::CStr(
+      automation::Get(code_view_object, cv::project::kName));
 }
 
 Strings ComponentNames(const kelSortedCVProject& entry) {
   Strings names;
   for (const auto& component : *entry.Components()) {
-    names.push_back(automation::CStr(
-        automation::Get(component->Component(), cv::component::kName)));
+    names.push_back(NameOf(component->Component()));
   }
   return names;
 }
@@ -98,11 +55,12 @@ Strings Languages(const kelSortedCVProjects& selection) {
 class KelSortedCVProjectsTest : public SelectionTest {};
 
 TEST_F(KelSortedCVProjectsTest, ProjectsAreFiledOnceUnderTheirComponent) {
-  auto gui = NewComponent("Gui", "VB");
+  // Gui's code is read by the VC++ add-in: its project's own language is
+  // not its component's.
+  auto gui = ComponentWithCode("Gui", "Visual Basic", {"Form", "Module"},
+                               nullptr, "VC++");
   auto engine = NewComponent("Engine", "VC++");
-  auto gui_project = NewProject("GuiProject", "Basic");
-  auto form = NewCodeComponent(gui_project, "Form");
-  NewCodeComponent(gui_project, "Module");
+  Object gui_project = CodeViewProjectOf(gui, "VC++");
   kelSortedCVProjects selection;
   EXPECT_TRUE(selection.GetProjects("VC++")->Empty());
 
@@ -110,21 +68,22 @@ TEST_F(KelSortedCVProjectsTest, ProjectsAreFiledOnceUnderTheirComponent) {
   ASSERT_NE(entry, nullptr);
   EXPECT_EQ(ComponentNames(*entry), (Strings{"Form", "Module"}));
   EXPECT_EQ(entry->OrelComponent(), Object(gui));
-  entry->RemoveComponent(form);
+  entry->RemoveComponent(Part(gui_project, 1));
   EXPECT_EQ(selection.AddProject(gui_project, gui), nullptr);
   EXPECT_EQ(ComponentNames(*entry), (Strings{"Module"}));
   // A project to be opened later may be added more than once.
   auto later = selection.AddProject(nullptr, engine);
   ASSERT_NE(later, nullptr);
   EXPECT_NE(selection.AddProject(nullptr, engine), nullptr);
-  EXPECT_EQ(
-      ErrorOf([&] { selection.AddProject(NewProject("P", "VB"), nullptr); }),
-      automation::kObjectNotSet);
+  auto other = ComponentWithCode("Other", "Visual Basic", {"Form"});
+  Object other_project = CodeViewProjectOf(other, "Visual Basic");
+  EXPECT_EQ(ErrorOf([&] { selection.AddProject(other_project, nullptr); }),
+            automation::kObjectNotSet);
 
-  EXPECT_EQ(Languages(selection), (Strings{"VB", "VC++"}));
-  EXPECT_EQ(selection.GetProjects("vb")->Item(1), entry);
+  EXPECT_EQ(Languages(selection), (Strings{"Visual Basic", "VC++"}));
+  EXPECT_EQ(selection.GetProjects("visual basic")->Item(1), entry);
   EXPECT_EQ(selection.FindProject(gui_project), entry);
-  EXPECT_EQ(selection.FindProject(NewProject("GuiProject", "Basic")), nullptr);
+  EXPECT_EQ(selection.FindProject(other_project), nullptr);
   EXPECT_EQ(selection.FindProject(nullptr), later);
   EXPECT_EQ(selection.FindProjectWithUniqueID(gui->UniqueId()), entry);
   std::string lower = gui->UniqueId();
@@ -132,7 +91,7 @@ TEST_F(KelSortedCVProjectsTest, ProjectsAreFiledOnceUnderTheirComponent) {
   EXPECT_EQ(selection.FindProjectWithUniqueID(lower), nullptr);
 
   // Removal: from where the entry is filed, though the project's own
-  // language differs; the first of each language by identifier.
+  // language differs; by identifier, the first of each language.
   selection.RemoveProject(gui_project);
   selection.RemoveProject(gui_project);
   EXPECT_EQ(Languages(selection), (Strings{"VC++"}));
@@ -145,53 +104,56 @@ TEST_F(KelSortedCVProjectsTest, ProjectsAreFiledOnceUnderTheirComponent) {
 }
 
 TEST_F(KelSortedCVProjectsTest, ComponentsAndMembersGoByIdentity) {
-  auto project = NewProject("Engine", "VC++");
-  auto shape = NewCodeComponent(project, "Shape");
-  auto circle = NewCodeComponent(project, "Circle");
-  auto member = std::make_shared<CodeViewObject>();
-  auto twin = std::make_shared<CodeViewObject>();
+  Object project = CodeViewProjectOf(
+      ComponentWithCode("Engine", "VC++", {"Shape", "Circle"}), "VC++");
+  Object shape = Part(project, 1);
+  Object circle = Part(project, 2);
+  Object member = automation::Collection::Create();
+  Object twin = automation::Collection::Create();
   kelSortedCVProjects selection;
 
   // A component of a project not selected yet brings the project along,
   // without model component, under the project's own language.
-  auto entry = selection.AddComponentToProject(shape);
-  ASSERT_NE(entry, nullptr);
+  ASSERT_NE(selection.AddComponentToProject(shape), nullptr);
   EXPECT_EQ(selection.AddComponentToProject(shape), nullptr);
-  auto project_entry = selection.FindProject(project);
-  ASSERT_NE(project_entry, nullptr);
-  EXPECT_EQ(project_entry->OrelComponent(), nullptr);
+  auto entry = selection.FindProject(project);
+  ASSERT_NE(entry, nullptr);
+  EXPECT_EQ(entry->OrelComponent(), nullptr);
   EXPECT_EQ(Languages(selection), (Strings{"VC++"}));
   EXPECT_TRUE(selection.IsComponentInProject(shape, project));
   EXPECT_FALSE(selection.IsComponentInProject(circle, project));
   selection.AddComponentToProject(circle);
-  EXPECT_EQ(ComponentNames(*project_entry), (Strings{"Shape", "Circle"}));
+  EXPECT_EQ(ComponentNames(*entry), (Strings{"Shape", "Circle"}));
 
-  struct Step {
+  Object stranger =
+      Part(CodeViewProjectOf(ComponentWithCode("Gui", "Visual Basic", {"Form"}),
+                             "Visual Basic"),
+           1);
+  const struct {
     const char* what;
     bool add;
     Object member;
     Object component;
     bool result;
-  };
-  const Step steps[] = {
+  } steps[] = {
       {"add", true, member, shape, true},
       {"again", true, member, shape, false},
       {"Nothing", true, nullptr, shape, false},
-      {"no entry", true, member, NewCodeComponent(project, "Other"), false},
+      {"no entry", true, member, stranger, false},
       {"twin", true, twin, shape, true},
-      {"absent", false, std::make_shared<CodeViewObject>(), shape, false},
+      {"absent", false, automation::Collection::Create(), shape, false},
       {"remove", false, member, shape, true},
       {"remove the last", false, twin, shape, true},
   };
-  for (const Step& step : steps) {
-    bool result = step.add ? project_entry->AddMemberInComponent(step.member,
-                                                                 step.component)
-                           : project_entry->RemoveMemberFromComponent(
-                                 step.member, step.component);
+  for (const auto& step : steps) {
+    bool result =
+        step.add
+            ? entry->AddMemberInComponent(step.member, step.component)
+            : entry->RemoveMemberFromComponent(step.member, step.component);
     EXPECT_EQ(result, step.result) << step.what;
   }
-  EXPECT_EQ(ComponentNames(*project_entry), (Strings{"Circle"}));
-  EXPECT_EQ(project_entry->GetCodeViewComponents().Item(1), Object(circle));
+  EXPECT_EQ(ComponentNames(*entry), (Strings{"Circle"}));
+  EXPECT_EQ(entry->GetCodeViewComponents().Item(1), circle);
 
   // The last component takes its project, and the language, along.
   selection.RemoveComponentFromProject(shape);  // not selected: nothing
@@ -201,42 +163,36 @@ TEST_F(KelSortedCVProjectsTest, ComponentsAndMembersGoByIdentity) {
 }
 
 TEST_F(KelSortedCVProjectsTest, InitCodeViewProjectBindsTheIdentifiers) {
-  auto other = NewComponent("Other", "VB");
+  auto other =
+      model_->RootComponentPackage()->NewPackage("Pkg")->NewComponent("Other");
   auto reporter = testing_support::RecordingObject::Create();
-  struct Case {
+  const struct {
     const char* what;
-    std::string project_id;  // "own": the component's
-    std::string project_after;
+    const char* code_id;  // the project's identifier in the code
     bool component_adopts;
+  } cases[] = {
+      {"empty", nullptr, false},
+      {"same", "SAME-ID", false},
+      {"free", "FREE-ID", true},
+      {"taken", other->UniqueId().c_str(), false},
   };
-  const Case cases[] = {
-      {"empty", "", "own", false},
-      {"same", "own", "own", false},
-      {"free", "FREE-ID", "FREE-ID", true},
-      {"taken", other->UniqueId(), other->UniqueId(), false},
-  };
-  for (const Case& c : cases) {
-    auto package = model_->RootComponentPackage()->NewPackage("Pkg");
-    auto component = package->NewComponent(std::string("Gui") + c.what);
-    component->SetLanguage("VB");
+  for (const auto& c : cases) {
+    auto component = ComponentWithCode(std::string("Gui") + c.what,
+                                       "Visual Basic", {"Form"}, c.code_id);
+    if (std::string(c.what) == "same") component->SetUniqueId("SAME-ID");
     std::string own = component->UniqueId();
-    auto project =
-        NewProject(c.what, "VB", c.project_id == "own" ? own : c.project_id);
-    Server("VB").code_view_project = [&](const Object& asked,
-                                         const Object& view) {
-      EXPECT_EQ(asked, Object(component));
-      EXPECT_EQ(view, Object(reporter));
-      return project;
-    };
     kelSortedComponents components;
     components.AddComponent(component);
     kelSortedCVProjects selection;
     auto entry = selection.AddProject(nullptr, component);
 
-    EXPECT_EQ(entry->InitCodeViewProject(reporter), Object(project)) << c.what;
-    std::string expected = c.project_after == "own" ? own : c.project_after;
-    EXPECT_EQ(UniqueIdOf(project), expected) << c.what;
-    EXPECT_EQ(component->UniqueId(), c.component_adopts ? expected : own)
+    Object project = entry->InitCodeViewProject(reporter);
+    ASSERT_NE(project, nullptr) << c.what;
+    EXPECT_EQ(project, CodeViewProjectOf(component, "Visual Basic"));
+    std::string project_id =
+        automation::CStr(automation::Get(project, cv::project::kUniqueId));
+    EXPECT_EQ(project_id, c.code_id ? c.code_id : own) << c.what;
+    EXPECT_EQ(component->UniqueId(), c.component_adopts ? project_id : own)
         << c.what;
     // Both selections follow the identities now held.
     EXPECT_EQ(selection.FindProject(project), entry) << c.what;
@@ -248,53 +204,60 @@ TEST_F(KelSortedCVProjectsTest, InitCodeViewProjectBindsTheIdentifiers) {
   auto errors = reporter->CallsTo("Error");
   ASSERT_EQ(errors.size(), 1u);
   EXPECT_EQ(automation::CStr(errors[0].args.at(0)),
-            "Could not change unique ID of \"Pkg::Guitaken\" to \"" +
+            "Could not change unique ID of \"Guitaken\" to \"" +
                 other->UniqueId() +
-                "\" because \"Other\" already has that "
-                "unique ID.");
+                "\" because \"Pkg::Other\" already has that unique ID.");
 
-  // A language without add-in: nothing, and a line in the debug log.
-  kelSortedCVProject lost(nullptr, NewComponent("Lost", "Cobol"));
-  EXPECT_EQ(lost.InitCodeViewProject(reporter), nullptr);
-  EXPECT_EQ(LogMessages().back().rfind(
-                "ERROR kelQLN.InitCodeViewProject(Cobol): ", 0),
-            0u);
+  // No project file (the add-in warns the code view given), or no add-in:
+  // Nothing, and a line in the debug log.
+  for (const char* language : {"Visual Basic", "Cobol"}) {
+    kelSortedCVProject lost(nullptr, NewComponent("Lost", language));
+    EXPECT_EQ(lost.InitCodeViewProject(reporter), nullptr);
+    EXPECT_EQ(LogMessages().back().rfind("ERROR kelQLN.InitCodeViewProject(" +
+                                             std::string(language) + "): ",
+                                         0),
+              0u);
+  }
+  EXPECT_EQ(reporter->CallsTo("Warning").size(), 1u);
 }
 
 TEST_F(KelSortedCVProjectsTest, SortProjectsFilesThoseWithAComponent) {
-  auto gui = NewComponent("Gui", "VB");
+  auto gui = ComponentWithCode("Gui", "Visual Basic", {}, "GUI-ID");
+  gui->SetUniqueId("GUI-ID");
+  auto stray = ComponentWithCode("Stray", "Visual Basic", {}, "NO-SUCH-ID");
   auto projects = automation::Collection::Create();
-  for (const auto& project :
-       {NewProject("Known", "Basic", gui->UniqueId()),
-        NewProject("Unknown", "Basic", "NO-SUCH-ID"),
-        NewProject("Known again", "Basic", gui->UniqueId())}) {
-    projects->Items().Add(Variant(project));
+  for (const auto& component : {gui, stray, gui}) {
+    projects->Items().Add(
+        Variant(CodeViewProjectOf(component, "Visual Basic")));
   }
-  auto workspace = std::make_shared<CodeViewObject>();
-  workspace->values[cv::workspace::kProjects] = Variant(projects);
+  auto workspace = testing_support::RecordingObject::Create(
+      [&](automation::DispId id, CallKind, Args&) {
+        return id == cv::workspace::kProjects ? Variant(projects) : Variant();
+      });
   SetOrelModel(model_);
   kelSortedCVProjects selection;
   selection.SortProjects(workspace);
   ResetRunGlobals();
 
-  auto filed = selection.GetProjects("VB");
-  ASSERT_EQ(filed->Count(), 2);
+  auto filed = selection.GetProjects("Visual Basic");
+  ASSERT_EQ(filed->Count(), 1);
   EXPECT_EQ(filed->Item(1)->OrelComponent(), Object(gui));
   Strings log = LogMessages();
   EXPECT_NE(std::find(log.begin(), log.end(),
                       "kelQLN.SortProjects: no model component has the unique "
-                      "ID \"NO-SUCH-ID\" of project \"Unknown\""),
+                      "ID \"NO-SUCH-ID\" of project \"Stray\""),
             log.end());
 }
 
 TEST_F(KelSortedCVProjectsTest, EntriesTraceTheirConstructionAndRelease) {
-  auto named = NewCodeComponent(NewProject("P", "VB"), "Named");
-  auto nameless = std::make_shared<CodeViewObject>();
+  Object project = CodeViewProjectOf(
+      ComponentWithCode("Traced", "Visual Basic", {"Named"}), "Visual Basic");
   const struct {
     Object held;
     std::string name;
-  } cases[] = {
-      {named, "Named"}, {nullptr, "<Nothing>"}, {nameless, "<UNKNOWN>"}};
+  } cases[] = {{Part(project, 1), "Named"},
+               {nullptr, "<Nothing>"},
+               {NewClass("Nameless"), "<UNKNOWN>"}};  // no member 2
   for (const auto& c : cases) {
     std::string address;
     {
@@ -308,11 +271,10 @@ TEST_F(KelSortedCVProjectsTest, EntriesTraceTheirConstructionAndRelease) {
     EXPECT_EQ(lines.back(), "    FinalRelease kelSortedCVComponent QLN:" +
                                 address + " " + c.name);
   }
-  { kelSortedCVProject project(NewProject("Traced", "VB"), nullptr); }
-  EXPECT_NE(LogMessages().back().find("FinalRelease kelSortedCVProject QLN:"),
-            std::string::npos);
-  EXPECT_EQ(LogMessages().back().substr(LogMessages().back().size() - 7),
-            " Traced");
+  { kelSortedCVProject entry(project, nullptr); }
+  std::string released = LogMessages().back();
+  EXPECT_EQ(released.rfind("    FinalRelease kelSortedCVProject QLN:", 0), 0u);
+  EXPECT_TRUE(released.ends_with(" Traced")) << released;
 
   // Without the trace's categories at level 4 nothing is written.
   EditRegistry([](platform::RegistryStore& store) {
@@ -320,7 +282,7 @@ TEST_F(KelSortedCVProjectsTest, EntriesTraceTheirConstructionAndRelease) {
                    0x0f000024);
   });
   size_t before = LogMessages().size();
-  { kelSortedCVComponent quiet(named); }
+  { kelSortedCVComponent quiet(project); }
   EXPECT_EQ(LogMessages().size(), before);
 }
 

@@ -59,8 +59,10 @@ TEST_F(MidlCompanionTest, IsMadeBesideTheComponentWithItsInterfaceFile) {
     std::string file_properties;  // after the copied and the Kind property
   };
   const std::vector<Case> cases = {
-      {{"s0.idl", "s0.odl"}, "VC++:FileName=" + dir + "s0.idl"},
-      {{"s1.odl"}, "VC++:FileName=" + dir + "s1.odl"},
+      {{"s0.idl", "s0.odl"},
+       "VC++:ProjectFile=" + dir + "s0.dsp VC++:FileName=" + dir + "s0.idl"},
+      {{"s1.odl"},
+       "VC++:ProjectFile=" + dir + "s1.dsp VC++:FileName=" + dir + "s1.odl"},
       {{},
        "VC++:ProjectFile= VC++:WorkspaceFile= VC++:ProjectName= "
        "VC++:FileName="},
@@ -68,8 +70,9 @@ TEST_F(MidlCompanionTest, IsMadeBesideTheComponentWithItsInterfaceFile) {
   for (size_t i = 0; i < cases.size(); ++i) {
     std::string name = "Shapes" + std::to_string(i);
     for (const auto& file : cases[i].files) Touch(file);
-    Server("VC++").project_file = " " + dir + "s" + std::to_string(i) + ".dsp";
     auto component = NewVcComponent(name);
+    component->CreateToolProperty("VC++", "ProjectFile",
+                                  dir + "s" + std::to_string(i) + ".dsp");
     kelSortedComponents selection;
     ASSERT_NE(selection.AddComponent(component), nullptr);
 
@@ -105,7 +108,7 @@ TEST_F(MidlCompanionTest, IsReusedOnlyWhenUsableInAModifiablePackage) {
   const Case cases[] = {
       {"same language", "VC++", "MIDL", true, true, "Create=False"},
       {"no language", "", "MIDL", true, true, "Create=False"},
-      {"other language", "VB", "MIDL", true, true, "CAN NOT"},
+      {"other language", "Visual Basic", "MIDL", true, true, "CAN NOT"},
       {"no Kind", "VC++", nullptr, true, true, "CAN NOT"},
       {"in the root", nullptr, nullptr, false, true, "Create=True"},
       {"nowhere", nullptr, nullptr, false, false, "CAN NOT"},

@@ -1,7 +1,8 @@
 // The world the selection tests run in: a model of the modelling tool with
-// its application, the add-ins "VisualStudio", "VC++" and "VB" described in
-// a test registry, each served by a small language server made by
-// programmatic identifier, and a debug log written to a file of the test.
+// its application, the add-ins "VisualStudio", "VC++" and "Visual Basic"
+// described in a test registry and served by the description add-in (or, to
+// see what the selection asks, by a small observing server), code
+// descriptions in files of the test, and a debug log written to another.
 #ifndef KELQLN_TESTS_SELECTION_SELECTION_TEST_SUPPORT_H_
 #define KELQLN_TESTS_SELECTION_SELECTION_TEST_SUPPORT_H_
 
@@ -21,6 +22,8 @@
 #include "automation/member_table.h"
 #include "entry/debug_log.h"
 #include "external/code_view.h"
+#include "external/orel.h"
+#include "host/codeview/registration.h"
 #include "host/modeltool/add_in_manager.h"
 #include "host/modeltool/add_in_registry.h"
 #include "host/modeltool/application.h"
@@ -40,63 +43,43 @@ using automation::CallKind;
 using automation::Object;
 using automation::Variant;
 
-// A statement generator that includes every element except those named
-// "Refused...", and keeps the arguments of each query.
-class TestGenerator : public automation::DispatchImpl<TestGenerator> {
+// A statement generator that includes every element and keeps the
+// arguments of each query, for the tests that look at what the selection
+// asks.
+class ObservedGenerator : public automation::DispatchImpl<ObservedGenerator> {
  public:
-  static const automation::MemberTable<TestGenerator>& Members() {
-    static const automation::MemberTable<TestGenerator> table(
-        "TestGenerator",
+  static const automation::MemberTable<ObservedGenerator>& Members() {
+    static const automation::MemberTable<ObservedGenerator> table(
+        "ObservedGenerator",
         {{external::code_view::statement_generator::kProcess,
           external::code_view::statement_generator::kProcessName,
-          CallKind::kMethod, [](TestGenerator& self, Args& args) {
+          CallKind::kMethod, [](ObservedGenerator& self, Args& args) {
             self.queries.push_back(args);
-            return Variant(
-                !automation::CStr(
-                     automation::Get(automation::CObj(args.at(1)), 100))
-                     .starts_with("Refused"));
+            return Variant(true);
           }}});
     return table;
   }
-
   std::vector<Args> queries;
 };
 
-// A language add-in's server: its own round-trip server, with a statement
-// generator (none when `generator` is null) and, for "VC++", the
-// component-properties service giving every component `project_file`.
-class TestLanguageServer : public automation::DispatchImpl<TestLanguageServer> {
+// A language add-in's server that is its own round-trip server and counts
+// how often its statement generator is read.
+class ObservedServer : public automation::DispatchImpl<ObservedServer> {
  public:
-  static const automation::MemberTable<TestLanguageServer>& Members() {
-    using Self = TestLanguageServer;
-    namespace rte = external::code_view::rte_server;
-    static const automation::MemberTable<Self> table(
-        "TestLanguageServer",
-        {{automation::kNamedOnly, rte::kStatementGenerator, CallKind::kMethod,
-          [](Self& self, Args&) {
+  static const automation::MemberTable<ObservedServer>& Members() {
+    static const automation::MemberTable<ObservedServer> table(
+        "ObservedServer",
+        {{automation::kNamedOnly,
+          external::code_view::rte_server::kStatementGenerator,
+          CallKind::kMethod, [](ObservedServer& self, Args&) {
             ++self.generator_reads;
             return Variant(self.generator);
-          }},
-         {automation::kNamedOnly,
-          external::code_view::add_in_server::kCompPropertiesApi,
-          CallKind::kMethod,
-          [](Self& self, Args&) { return Variant(self.shared_from_this()); }},
-         {automation::kNamedOnly,
-          external::code_view::comp_properties::kProjectFile, CallKind::kMethod,
-          [](Self& self, Args&) { return Variant(self.project_file); }},
-         {automation::kNamedOnly, rte::kCodeViewProject, CallKind::kMethod,
-          [](Self& self, Args& args) {
-            return Variant(self.code_view_project(
-                automation::CObj(args.at(0)), automation::CObj(args.at(1))));
           }}});
     return table;
   }
-
-  std::shared_ptr<TestGenerator> generator = std::make_shared<TestGenerator>();
+  std::shared_ptr<ObservedGenerator> generator =
+      std::make_shared<ObservedGenerator>();
   int generator_reads = 0;
-  std::string project_file;
-  std::function<Object(const Object& component, const Object& reporter)>
-      code_view_project;
 };
 
 inline constexpr char kAddInsKey[] = "SOFTWARE\\Quenta Software\\Orel\\AddIns";
@@ -119,7 +102,7 @@ class SelectionTest : public ::testing::Test {
   }
 
   void TearDown() override {
-    for (const auto& [name, server] : servers_) {
+    for (const auto& [name, server] : observed_) {
       automation::UnregisterClass("kelqln.test." + name);
     }
     platform::UseRegistryStore(platform::RegistryStore());
@@ -127,18 +110,25 @@ class SelectionTest : public ::testing::Test {
     std::filesystem::remove_all(directory_);
   }
 
-  // Describes the add-ins in the registry and installs them.
+  // Installs the add-ins "VisualStudio", "VC++" and "Visual Basic": the
+  // description add-in, which refuses elements of stereotype "Refused",
+  // except those named in `observed_`, served by an ObservedServer.
   void Install() {
+    host::codeview::RegisterCodeViewClasses();
     const auto hklm = platform::kHkeyLocalMachine;
     int n = 0;
-    for (const char* name : {"VisualStudio", "VC++", "VB"}) {
+    for (const char* name : {"VisualStudio", "VC++", "Visual Basic"}) {
       store_.SetString(hklm, kAddInsKey, std::to_string(++n), name);
-      std::string prog_id = std::string("kelqln.test.") + name;
-      store_.SetString(hklm, std::string(kAddInsKey) + "\\" + name,
-                       "ServerProgId", prog_id);
-      auto server = std::make_shared<TestLanguageServer>();
-      servers_[name] = server;
-      automation::RegisterClass(prog_id, "", [server] { return server; });
+      std::string key = std::string(kAddInsKey) + "\\" + name;
+      std::string prog_id = host::codeview::kDescriptionProgId;
+      if (observed_.count(name)) {
+        auto server = std::make_shared<ObservedServer>();
+        observed_[name] = server;
+        prog_id = std::string("kelqln.test.") + name;
+        automation::RegisterClass(prog_id, "", [server] { return server; });
+      }
+      store_.SetString(hklm, key, "ServerProgId", prog_id);
+      store_.SetString(hklm, key, "RefusedStereotypes", "Refused");
     }
     // Categories 2 and 5 at every level, without time stamps.
     store_.SetDword(hklm, kSettingsKey, "Debug", 0x7f000024);
@@ -177,8 +167,48 @@ class SelectionTest : public ::testing::Test {
     return messages;
   }
 
-  TestLanguageServer& Server(const std::string& name) {
-    return *servers_.at(name);
+  // Sets a value under an add-in's key.
+  void SetAddInValue(const std::string& add_in, const std::string& name,
+                     const std::string& text) {
+    EditRegistry([&](platform::RegistryStore& store) {
+      store.SetString(platform::kHkeyLocalMachine,
+                      std::string(kAddInsKey) + "\\" + add_in, name, text);
+    });
+  }
+
+  // A component of `language` whose code, for the description add-in
+  // `add_in` (by default its language's), is a project named `name` with
+  // the code-view components `components` and, unless null, the unique
+  // identifier `id`.
+  std::shared_ptr<host::modeltool::Component> ComponentWithCode(
+      const std::string& name, const std::string& language,
+      const std::vector<std::string>& components, const char* id = nullptr,
+      std::string add_in = "") {
+    if (add_in.empty()) add_in = language;
+    auto component = NewComponent(name, language);
+    std::string file = (directory_ / (name + ".json")).string();
+    component->OverrideToolProperty(add_in, "ProjectFile", file);
+    std::string text =
+        R"({"format": "kelqln-code-description", "version": 1, "name": ")" +
+        name + "\"" + (id ? std::string(R"(, "id": ")") + id + "\"" : "") +
+        R"(, "components": [)";
+    for (const auto& part : components) {
+      text += std::string(text.back() == '[' ? "" : ",") + R"({"name": ")" +
+              part + "\"}";
+    }
+    std::ofstream(file) << text << "]}";
+    return component;
+  }
+
+  // The code-view project of `component` from the add-in `add_in`.
+  Object CodeViewProjectOf(const Object& component, const std::string& add_in) {
+    Object server = automation::GetObject(app_->AddIns()->Find(add_in),
+                                          external::orel::add_in::kServer);
+    return automation::CObj(automation::CallByName(
+        automation::CObj(automation::CallByName(
+            server, external::code_view::add_in_server::kGetRteServer)),
+        external::code_view::rte_server::kCodeViewProject, component,
+        Object()));
   }
 
   std::shared_ptr<host::modeltool::Component> NewComponent(
@@ -206,7 +236,8 @@ class SelectionTest : public ::testing::Test {
   std::shared_ptr<host::modeltool::Model> model_ =
       host::modeltool::Model::Create(
           host::modeltool::SequentialUniqueIds("ID"));
-  std::map<std::string, std::shared_ptr<TestLanguageServer>> servers_;
+  // Set before SetUp: the add-ins to serve by an ObservedServer.
+  std::map<std::string, std::shared_ptr<ObservedServer>> observed_;
   platform::RegistryStore store_;
 };
 
