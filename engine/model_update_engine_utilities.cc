@@ -106,6 +106,10 @@ void SaveModel(const Object& theOrelApp) {
     automation::Call(model, orel::model::kSave);
     return;
   }
+  SaveModelUnderChosenName(theOrelApp);
+}
+
+void SaveModelUnderChosenName(const Object& theOrelApp) {
   automation::Let(theOrelApp, orel::application::kSaveDialogPending, true);
   std::string file_name;
   ShowSaveDialog(
@@ -113,7 +117,9 @@ void SaveModel(const Object& theOrelApp) {
       StringResText(kSaveDialogTitle),
       automation::CallByName(theOrelApp, orel::application::kGetMainWnd));
   if (IsBlank(file_name)) return;
-  automation::Call(model, orel::model::kSaveAs, file_name);
+  automation::Call(
+      automation::GetObject(theOrelApp, orel::application::kCurrentModel),
+      orel::model::kSaveAs, file_name);
 }
 
 void ShowSaveDialog(std::string& fileName, const std::string& filter,

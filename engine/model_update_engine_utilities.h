@@ -40,6 +40,11 @@ bool QueryStatementGenerator(automation::Object& element);
 // saved when that name is blank). Failures of the save reach the caller.
 void SaveModel(const automation::Object& theOrelApp);
 
+// Tells the application that a save dialog comes, asks for a file name in
+// it and saves the current model of `theOrelApp` under that name; a blank
+// name saves nothing.
+void SaveModelUnderChosenName(const automation::Object& theOrelApp);
+
 // Shows the common save dialog with `filter`, and `title` and `owner` when
 // given, starting from `fileName` unless that is empty; `fileName` becomes
 // the dialog's answer. Without the dialog component nothing happens and

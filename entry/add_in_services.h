@@ -21,8 +21,11 @@ namespace kelqln {
 
 // The tag of this tool in the add-ins' "Enable<tag>" values.
 inline constexpr char kQuillonTag[] = "QLN";
-// The add-in that holds the wizard's settings and the tool-wide ones.
+// The add-in that holds the wizard's settings and the tool-wide ones, and
+// its key below HKEY_LOCAL_MACHINE, where the tool-wide settings are read.
 inline constexpr char kVSAddInName[] = "VisualStudio";
+inline constexpr char kVSAddInKey[] =
+    "SOFTWARE\\Quenta Software\\Orel\\AddIns\\VisualStudio";
 
 // The text of a string value, the number (Long) of a 32-bit number value, or
 // Empty when the key or value is missing or of any other type.

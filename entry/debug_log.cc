@@ -14,8 +14,6 @@
 namespace kelqln {
 namespace {
 
-constexpr char kSettingsKey[] =
-    "SOFTWARE\\Quenta Software\\Orel\\AddIns\\VisualStudio";
 constexpr char kLogFileName[] = "keldebuglog.txt";
 constexpr int kWriteAttempts = 5;
 constexpr uint32_t kWaitBetweenAttemptsMs = 100;
@@ -34,7 +32,7 @@ DebugSettings& Settings() {
 }
 
 automation::Variant ReadSetting(std::string_view name) {
-  return ReadRegistryValue(platform::kHkeyLocalMachine, kSettingsKey, name);
+  return ReadRegistryValue(platform::kHkeyLocalMachine, kVSAddInKey, name);
 }
 
 std::string ReadLogFileName() {

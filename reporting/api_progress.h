@@ -14,6 +14,8 @@
 
 #include "automation/collection.h"
 #include "automation/member_table.h"
+#include "automation/server_module.h"
+#include "entry/server_module.h"
 #include "reporting/i_reporter.h"
 #include "reporting/kel_reporter_api.h"
 
@@ -149,6 +151,7 @@ class APIProgress : public automation::DispatchImpl<APIProgress>,
   std::vector<automation::Object> sinks_;
   bool cancelled_ = false;
   int32_t information_type_ = 0;
+  automation::ServerModule::LiveObject live_{KelQLNModule()};
 };
 
 }  // namespace kelqln

@@ -9,6 +9,8 @@
 #include <string>
 
 #include "automation/member_table.h"
+#include "automation/server_module.h"
+#include "entry/server_module.h"
 #include "reporting/kel_reporter_api.h"
 
 namespace kelqln {
@@ -73,6 +75,7 @@ class shared_simplereporter
   std::string text_;
   int16_t errors_ = 0;
   int16_t warnings_ = 0;
+  automation::ServerModule::LiveObject live_{KelQLNModule()};
 };
 
 }  // namespace kelqln

@@ -122,7 +122,7 @@ std::shared_ptr<RealizeRelation> Class::NewRealizeRelation(
                      std::move(supplier_name), unique_id);
 }
 
-bool Class::DeleteAttribute(const std::shared_ptr<Attribute>& attribute) {
+bool Class::DeleteAttribute(std::shared_ptr<Attribute> attribute) {
   auto at = std::find(attributes_.begin(), attributes_.end(), attribute);
   if (!attribute || at == attributes_.end()) return false;
   attributes_.erase(at);
@@ -130,7 +130,7 @@ bool Class::DeleteAttribute(const std::shared_ptr<Attribute>& attribute) {
   return true;
 }
 
-bool Class::DeleteOperation(const std::shared_ptr<Operation>& operation) {
+bool Class::DeleteOperation(std::shared_ptr<Operation> operation) {
   auto at = std::find(operations_.begin(), operations_.end(), operation);
   if (!operation || at == operations_.end()) return false;
   operations_.erase(at);
@@ -140,7 +140,7 @@ bool Class::DeleteOperation(const std::shared_ptr<Operation>& operation) {
 
 template <class R>
 bool Class::DeleteRelation(std::vector<std::shared_ptr<R>>& list,
-                           const std::shared_ptr<R>& relation) {
+                           std::shared_ptr<R> relation) {
   auto at = std::find(list.begin(), list.end(), relation);
   if (!relation || at == list.end()) return false;
   list.erase(at);
@@ -148,22 +148,19 @@ bool Class::DeleteRelation(std::vector<std::shared_ptr<R>>& list,
   return true;
 }
 
-bool Class::DeleteHasRelationship(
-    const std::shared_ptr<HasRelationship>& relation) {
+bool Class::DeleteHasRelationship(std::shared_ptr<HasRelationship> relation) {
   return DeleteRelation(has_relationships_, relation);
 }
 
-bool Class::DeleteInheritRelation(
-    const std::shared_ptr<InheritRelation>& relation) {
+bool Class::DeleteInheritRelation(std::shared_ptr<InheritRelation> relation) {
   return DeleteRelation(inherit_relations_, relation);
 }
 
-bool Class::DeleteRealizeRelation(
-    const std::shared_ptr<RealizeRelation>& relation) {
+bool Class::DeleteRealizeRelation(std::shared_ptr<RealizeRelation> relation) {
   return DeleteRelation(realize_relations_, relation);
 }
 
-bool Class::DeleteAssociation(const std::shared_ptr<Association>& association) {
+bool Class::DeleteAssociation(std::shared_ptr<Association> association) {
   if (!association) return false;
   bool takes_part =
       std::any_of(associations_.begin(), associations_.end(),

@@ -71,13 +71,15 @@ class Class : public ElementImpl<Class> {
       std::string supplier_name = "", const std::string& unique_id = "");
 
   // Deletions: true when done, false when the element is not this class's.
-  bool DeleteAttribute(const std::shared_ptr<Attribute>& attribute);
-  bool DeleteOperation(const std::shared_ptr<Operation>& operation);
-  bool DeleteHasRelationship(const std::shared_ptr<HasRelationship>& relation);
-  bool DeleteInheritRelation(const std::shared_ptr<InheritRelation>& relation);
-  bool DeleteRealizeRelation(const std::shared_ptr<RealizeRelation>& relation);
+  // Deletions take the element by value: a caller may pass the very entry of
+  // the list that the deletion removes.
+  bool DeleteAttribute(std::shared_ptr<Attribute> attribute);
+  bool DeleteOperation(std::shared_ptr<Operation> operation);
+  bool DeleteHasRelationship(std::shared_ptr<HasRelationship> relation);
+  bool DeleteInheritRelation(std::shared_ptr<InheritRelation> relation);
+  bool DeleteRealizeRelation(std::shared_ptr<RealizeRelation> relation);
   // Deletes an association this class takes part in, with both its roles.
-  bool DeleteAssociation(const std::shared_ptr<Association>& association);
+  bool DeleteAssociation(std::shared_ptr<Association> association);
 
   const std::vector<std::shared_ptr<Attribute>>& Attributes() const {
     return attributes_;
@@ -123,7 +125,7 @@ class Class : public ElementImpl<Class> {
                                  const std::string& unique_id);
   template <class R>
   bool DeleteRelation(std::vector<std::shared_ptr<R>>& list,
-                      const std::shared_ptr<R>& relation);
+                      std::shared_ptr<R> relation);
 
   std::weak_ptr<LogicalPackage> package_;
   std::vector<std::weak_ptr<Component>> components_;

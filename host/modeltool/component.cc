@@ -47,8 +47,7 @@ std::shared_ptr<Dependency> Component::NewDependency(
   return dependency;
 }
 
-bool Component::DeleteDependency(
-    const std::shared_ptr<Dependency>& dependency) {
+bool Component::DeleteDependency(std::shared_ptr<Dependency> dependency) {
   auto at = std::find(dependencies_.begin(), dependencies_.end(), dependency);
   if (!dependency || at == dependencies_.end()) return false;
   dependencies_.erase(at);

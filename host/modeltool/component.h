@@ -37,7 +37,7 @@ class Component : public ElementImpl<Component> {
       const std::shared_ptr<Component>& supplier, std::string name = "",
       const std::string& unique_id = "");
   // False when the dependency is not this component's.
-  bool DeleteDependency(const std::shared_ptr<Dependency>& dependency);
+  bool DeleteDependency(std::shared_ptr<Dependency> dependency);
   const std::vector<std::shared_ptr<Dependency>>& Dependencies() const {
     return dependencies_;
   }

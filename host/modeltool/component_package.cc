@@ -36,8 +36,7 @@ std::shared_ptr<ComponentPackage> ComponentPackage::NewPackage(
   return package;
 }
 
-bool ComponentPackage::DeleteComponent(
-    const std::shared_ptr<Component>& component) {
+bool ComponentPackage::DeleteComponent(std::shared_ptr<Component> component) {
   if (!component || component->Package().get() != this) return false;
   RequireModel()->DestroyComponent(component);
   return true;

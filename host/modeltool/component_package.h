@@ -29,7 +29,7 @@ class ComponentPackage : public ElementImpl<ComponentPackage> {
   // Deletes a component of this package with everything that hangs on it
   // (class assignments, its dependencies and those on it, the selection);
   // false when it is not this package's.
-  bool DeleteComponent(const std::shared_ptr<Component>& component);
+  bool DeleteComponent(std::shared_ptr<Component> component);
 
   const std::vector<std::shared_ptr<Component>>& Components() const {
     return components_;

@@ -35,7 +35,7 @@ std::shared_ptr<LogicalPackage> LogicalPackage::NewPackage(
   return package;
 }
 
-bool LogicalPackage::DeleteClass(const std::shared_ptr<Class>& cls) {
+bool LogicalPackage::DeleteClass(std::shared_ptr<Class> cls) {
   if (!cls || cls->Package().get() != this) return false;
   RequireModel()->DestroyClass(cls);
   return true;

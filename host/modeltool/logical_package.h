@@ -30,7 +30,7 @@ class LogicalPackage : public ElementImpl<LogicalPackage> {
   // members, the relations of other classes to it, the associations it takes
   // part in, its component assignments and its place in the selection.
   // False when the class is not this package's.
-  bool DeleteClass(const std::shared_ptr<Class>& cls);
+  bool DeleteClass(std::shared_ptr<Class> cls);
 
   const std::vector<std::shared_ptr<Class>>& Classes() const {
     return classes_;

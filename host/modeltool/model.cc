@@ -190,7 +190,7 @@ std::shared_ptr<Association> Model::MakeAssociation(
   return association;
 }
 
-bool Model::DeleteAssociation(const std::shared_ptr<Association>& association) {
+bool Model::DeleteAssociation(std::shared_ptr<Association> association) {
   if (!association || !EraseElement(associations_, *association)) return false;
   for (const auto& role : {association->role1_, association->role2_}) {
     if (auto cls = role->GetClass())
@@ -213,7 +213,7 @@ void Model::DestroyOperation(Operation& operation) {
   Forget(operation);
 }
 
-void Model::DestroyClass(const std::shared_ptr<Class>& cls) {
+void Model::DestroyClass(std::shared_ptr<Class> cls) {
   // Relations of other classes that point at this one go with it.
   auto pointing = cls->supplier_of_;
   for (const auto& weak : pointing) {
@@ -254,7 +254,7 @@ void Model::DestroyClass(const std::shared_ptr<Class>& cls) {
   Forget(*cls);
 }
 
-void Model::DestroyComponent(const std::shared_ptr<Component>& component) {
+void Model::DestroyComponent(std::shared_ptr<Component> component) {
   for (const auto& weak : component->classes_) {
     if (auto cls = weak.lock()) EraseElement(cls->components_, *component);
   }

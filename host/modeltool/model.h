@@ -79,7 +79,7 @@ class Model : public automation::DispatchImpl<Model> {
       std::string name = "", const std::string& unique_id = "");
   // Removes the association and both its roles; false when it is not this
   // model's.
-  bool DeleteAssociation(const std::shared_ptr<Association>& association);
+  bool DeleteAssociation(std::shared_ptr<Association> association);
   const std::vector<std::shared_ptr<Association>>& Associations() const {
     return associations_;
   }
@@ -168,8 +168,8 @@ class Model : public automation::DispatchImpl<Model> {
   void ForgetSelected(const Element& element);
   void AddComponent(std::shared_ptr<Component> component);
   void AddClass(std::shared_ptr<Class> cls);
-  void DestroyComponent(const std::shared_ptr<Component>& component);
-  void DestroyClass(const std::shared_ptr<Class>& cls);
+  void DestroyComponent(std::shared_ptr<Component> component);
+  void DestroyClass(std::shared_ptr<Class> cls);
   // Takes a relation out of its supplier's back references and the index
   // (its owner has already dropped it).
   void DestroyRelation(ClassRelation& relation);

@@ -29,7 +29,7 @@ std::shared_ptr<Parameter> Operation::NewParameter(
   return parameter;
 }
 
-bool Operation::DeleteParameter(const std::shared_ptr<Parameter>& parameter) {
+bool Operation::DeleteParameter(std::shared_ptr<Parameter> parameter) {
   auto at = std::find(parameters_.begin(), parameters_.end(), parameter);
   if (!parameter || at == parameters_.end()) return false;
   parameters_.erase(at);

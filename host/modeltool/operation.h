@@ -28,7 +28,7 @@ class Operation : public ElementImpl<Operation> {
                                           std::string type = "",
                                           const std::string& unique_id = "");
   // False when the parameter is not this operation's.
-  bool DeleteParameter(const std::shared_ptr<Parameter>& parameter);
+  bool DeleteParameter(std::shared_ptr<Parameter> parameter);
   const std::vector<std::shared_ptr<Parameter>>& Parameters() const {
     return parameters_;
   }

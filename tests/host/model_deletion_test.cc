@@ -179,6 +179,23 @@ TEST(ModelDeletionTest, ADeletedElementIsCutLoose) {
             automation::kObjectNotSet);
 }
 
+TEST(ModelDeletionTest, TheListEntryItselfMayBePassedToTheDeletion) {
+  // The caller's reference is the entry the deletion erases; the deletion
+  // must still finish on a live element (caught by the sanitizer build).
+  SampleModel s;
+  s.draw.reset();
+  s.x.reset();
+  s.y.reset();
+  auto draw = s.shape->Operations().front();
+  draw->NewParameter("scale", "double");
+  EXPECT_TRUE(draw->DeleteParameter(draw->Parameters().back()));
+  draw.reset();
+  EXPECT_TRUE(s.shape->DeleteAttribute(s.shape->Attributes().front()));
+  EXPECT_TRUE(s.shape->DeleteOperation(s.shape->Operations().front()));
+  EXPECT_TRUE(s.domain->DeleteClass(s.domain->Classes().back()));
+  EXPECT_EQ(s.model->IntegrityProblems(), std::vector<std::string>());
+}
+
 TEST(ModelDeletionTest, AClassRelatedToItselfAndAssociatedWithItself) {
   SampleModel s;
   auto node = s.domain->NewClass("Node");
