@@ -96,7 +96,7 @@ int UpdateCommand::Run() {
   std::string failure = StartRun(host.App(), selection, callback, report);
   host.App()->SetLogSink(nullptr);
   report.deleted = callback->Deleted();
-  if (!options_.quiet) {
+  if (!options_.quiet && !report.summaries.empty()) {
     // The summary repeats lines of the log: a blank line sets it apart.
     out_ << '\n';
     PrintLines(report.summaries);

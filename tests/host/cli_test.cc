@@ -355,6 +355,27 @@ TEST_F(CliTest, ReportHoldsTheFourCollectionsAndTheDeletedElements) {
             expected);
 }
 
+// The system hands back no reporter when a run breaks off: here the
+// component's language has no active add-in.
+TEST_F(CliTest, FailedRunIsReportedAndNeverSaved) {
+  WriteText(directory_ / "registry.reg",
+            ReadText(directory_ / "registry.reg") +
+                "\n[HKEY_LOCAL_MACHINE\\SOFTWARE\\Quenta Software\\Orel\\"
+                "AddIns\\VC++]\n\"Active\"=dword:00000000\n");
+  const std::string original = Model();
+  Result run = Update({"--report", "report.json"});
+  EXPECT_EQ(run.code, 1);
+  EXPECT_EQ(run.out, "");
+  EXPECT_EQ(run.err,
+            "kelqln: the update failed: Invalid procedure call or argument "
+            "(error 5); library.json was left as it was\n");
+  EXPECT_EQ(
+      nlohmann::json::parse(ReadText(directory_ / "report.json"))["errors"],
+      nlohmann::json::array(
+          {"The update failed: Invalid procedure call or argument (error 5)"}));
+  EXPECT_EQ(Model(), original);
+}
+
 // A run killed while it updates leaves the model file as it was: nothing is
 // written before the run has finished, and the save replaces the file whole.
 TEST_F(CliTest, KilledRunLeavesTheModelIntact) {
