@@ -60,7 +60,7 @@ std::string FindRegistryFile(const std::string& option) {
   }
   std::vector<fs::path> candidates = {
       platform::RegistryFilePath(),
-      ProgramDirectory() / "../share/kelqln/registry.reg",
+      (ProgramDirectory() / "../share/kelqln/registry.reg").lexically_normal(),
       KELQLN_SOURCE_REGISTRY,
   };
   std::string found = FirstFile(candidates);
@@ -81,13 +81,13 @@ std::string FindAddInLibrary() {
     return variable;
   }
   fs::path directory = ProgramDirectory();
-  std::vector<fs::path> candidates = {directory / "libkelqln.so",
-                                      directory / "../lib/libkelqln.so"};
+  std::vector<fs::path> candidates = {
+      directory / "libkelqln.so",
+      (directory / "../lib/libkelqln.so").lexically_normal()};
   std::string found = FirstFile(candidates);
   if (found.empty()) {
     throw UsageError(
-        "the add-in library libkelqln.so was not found (looked "
-        "for " +
+        "the add-in library libkelqln.so was not found (looked for " +
         Listed(candidates) + "); name it with KELQLN_LIBRARY");
   }
   return found;
